@@ -1,0 +1,424 @@
+// The robot configuration of one user program: every motor, sensor, servo,
+// hub, serial port, board, drive-train, memory and network setting that the
+// program's "#pragma config(...)" block describes, how that block is read
+// line by line, and how it is written back.
+//
+// The class is abstract: a host derives its own configuration class from it
+// and supplies the pure virtual operations (see host/HostConfiguration.h for
+// the reference host class).
+#pragma once
+
+#include <array>
+#include <cstdint>
+
+#include "host/CString.h"
+#include "host/DeviceTypes.h"
+#include "host/LineNumber.h"
+#include "host/PidSettings.h"
+#include "motors/MotorIOPins.h"
+
+namespace Networking {
+class CNtwkInfoFromPragmas;
+}
+
+/// Fixed capacities of the record.
+constexpr int kMaxNumbOfMotors = 36;
+constexpr int kMaxNumbOfSensorPorts = 98;
+constexpr int kMaxNumbOfServos = 128;
+constexpr int kMaxNumbOfServoPositionSets = 40;
+constexpr int kNumbOfServoPositionsPerSet = 8;
+constexpr int kMaxNumbOfSerialPorts = 6;
+constexpr int kNumbOfPluginSlots = 3;
+constexpr int kNumbOfHubSensorPorts = 4;
+constexpr int kNumbOfHubChainPositions = 4;
+constexpr int kNumbOfMemorySizes = 3;
+
+/// The start and end markers that frame the generated-code comment line, and
+/// the marker of an empty configuration block.
+extern const wchar_t *const sConfigStartMarker;     // "//*!!"
+extern const wchar_t *const sConfigEndMarker;       // "!!*//"
+extern const wchar_t *const sConfigEmptyBlockMarker;  // "//*!!!!*//"
+
+/// One motor index of the settings block.
+struct TMotorSlot {
+  TMotorTypes nMotorType;
+  bool bEncoder;
+  bool bPIDControlled;
+  bool bReversed;
+  TMotorDriveSide nDriveSide;  ///< 0 none, 1 left, 2 right
+  int32_t nEncoderPort;        ///< sensor port of the encoder, -1 none
+  int32_t nPrimaryIOPin;       ///< sensor port of the first IO pin, -1 none
+  int32_t nSecondaryIOPin;     ///< sensor port of the second IO pin, -1 none
+  TPidSettings pidSettings;
+};
+
+/// Every scalar setting of a configuration, cleared, copied and compared as
+/// one block of plain data.
+struct TConfigurationSettings {
+  int32_t nPlatformKind;  ///< platform kind when the record was last cleared
+  TControllerBoardType nCircuitBoardType;
+  std::array<int32_t, 3> nSpareWords;
+  int32_t bFwTimedServo;
+  int32_t bFwSounds;
+  TJoystickDriveType nJoystickMotorDriveType;
+  TJoystickAxisScaling nJoystickMotorAxisScaling;
+  TGripperArmType nGripperArmType;
+  std::array<int32_t, 4> nGripperArmMotorIndex;   ///< -1 none
+  std::array<uint16_t, 5> nDriveTrainWheels;
+  std::array<uint8_t, 4> nDriveTrainMotorIndex;   ///< 255 none
+  uint8_t nDriveTrainType;
+  std::array<TMotorSlot, kMaxNumbOfMotors> motors;
+  const TMotorIOPinsDefinition *pMotorIOPinTable;  ///< board's pin table, not owned
+  int32_t nNumbOfEntriesInMotorIOPinTable;
+  std::array<TSensorTypes, kMaxNumbOfSensorPorts> nSensorTypes;
+  std::array<TSensorModes, kMaxNumbOfSensorPorts> nSensorModes;
+  std::array<TServoTypes, kMaxNumbOfServos> nServoTypes;
+  std::array<int32_t, kMaxNumbOfServos> nServoSettings;
+  std::array<int32_t, kMaxNumbOfSensorPorts> nI2CAddresses;
+  std::array<std::array<uint8_t, kNumbOfServoPositionsPerSet>, kMaxNumbOfServoPositionSets> nServoPositions;
+  int32_t nNumbOfServoPositions;
+  std::array<TSerialPortMode, kMaxNumbOfSerialPorts> nUARTMode;
+  std::array<TBaudRate, kMaxNumbOfSerialPorts> nUARTBaudRate;
+  std::array<int32_t, kMaxNumbOfSerialPorts> nI2CMode;
+  int32_t nUnnamedAfterI2CMode;  ///< 1 after a clear; kept, never interpreted
+  int32_t nProgramType;
+  std::array<int32_t, kNumbOfMemorySizes> nMemorySizes;  ///< -1 = auto
+  std::array<int32_t, kNumbOfPluginSlots> nPluginBoardTypes;
+  int32_t nCpuClockSpeed;
+  std::array<std::array<TSensorPortHub, kNumbOfHubChainPositions>, kNumbOfHubSensorPorts> nSensorPortHubs;
+  std::array<int32_t, kMaxNumbOfSensorPorts> nSecondaryPorts;  ///< -1 none
+};
+
+/// Definition lines and values derived while reading.
+struct TConfigurationParseInfo {
+  TLineNumber firstConfigLine;
+  bool bFirstConfigLineSeen;
+  bool bNonCanonicalPortNames;
+  std::array<TLineNumber, kMaxNumbOfServos> servoDefinitionLines;
+  std::array<TLineNumber, kMaxNumbOfSensorPorts> sensorDefinitionLines;
+  std::array<TLineNumber, kMaxNumbOfMotors> motorDefinitionLines;
+  bool bMotorListIndexMappingBuilt;
+  std::array<int32_t, kMaxNumbOfMotors> nMotorListIndexMapping;
+  std::array<int32_t, 3> nCompileCodeSizeResults;
+
+  /// Default-constructs the line numbers and leaves the other members unset.
+  TConfigurationParseInfo() {}  // NOLINT: members are set by the record's clear
+};
+
+/// Class of a tokenized source line.
+enum TTokenizedLineType : int32_t {
+  lineTypeBlank = 0,
+  lineTypeOther = 1,
+  lineTypeMarkerComment = 2,
+  lineTypeConfigPragma = 3,
+  lineTypeContainsMarker = 4,
+  lineTypeNoTokens = 5,
+};
+
+constexpr int kMaxConfigTokens = 13;
+constexpr int kMaxConfigTokenLength = 99;
+
+/// A configuration line split into its keyword (element 0) and parameters.
+struct TTokenizedConfigParms {
+  int32_t nNumbOfParms = 0;  ///< tokens stored, the keyword included
+  std::array<CString, kMaxConfigTokens> sParms;
+};
+
+/// Configuration keywords by value; the keyword table spells them.
+typedef int32_t TConfigTypes;
+enum : int32_t {
+  configTypeStandardModel = 0,
+  configTypeUserModel = 1,
+  configTypeRenameMotor = 2,
+  configTypeRenameSensor = 3,
+  configTypeDriveTrainMotors = 4,
+  configTypeDriveTrainWheels = 5,
+  configTypeGripperArm = 6,
+  configTypeJoystickDrive = 7,
+  configTypeFirmwareFeatures = 8,
+  configTypeHubs = 9,
+  configTypeMotor = 10,
+  configTypeMotorPidSetting = 11,
+  configTypeSensor = 12,
+  configTypeServo = 13,
+  configTypeServoPosition = 14,
+  configTypeCpuParameters = 15,
+  configTypeProgramType = 16,
+  configTypeCircuitBoardType = 17,
+  configTypePluginCircuitBoard = 18,
+  configTypeUartUsage = 19,
+  configTypeI2CUsage = 20,
+  configTypeMemorySize = 21,
+  configTypeDatalogSeries = 22,
+  configTypeNetworkDefinition = 23,
+  configTypeNetworkNode = 24,
+  configTypeAnalog = 25,
+  configTypeNotFound = -1,
+};
+constexpr int kNumbOfConfigTypes = 26;
+
+/// The keyword table, reached through the exported `nConfigTypeNames`.
+class TConfigTypeDefns {
+ public:
+  /// Keyword of a value 0..25 (the canonical spelling); "" outside that range.
+  static const wchar_t *getConfigTypeName(TConfigTypes nType);
+  /// Value of a keyword compared without regard to case; -1 when none.
+  static TConfigTypes lookupConfigType(const CString &sKeyword);
+};
+extern const TConfigTypeDefns nConfigTypeNames;
+
+/// Result of comparing two configurations.
+typedef int32_t TConfigCompareResults;
+enum : int32_t {
+  configCompareSame = 0,
+  configCompareNamesDiffer = 1,
+  configCompareSettingsDiffer = 2,
+  configCompareModelNamesDiffer = 4,
+};
+
+class CRobotConfigurationBasic {
+ public:
+  CRobotConfigurationBasic();
+  CRobotConfigurationBasic(const CRobotConfigurationBasic &source);
+  virtual ~CRobotConfigurationBasic();
+
+  // ---- Virtual operations, in slot order -------------------------------
+  /// Path of the program file the configuration belongs to.
+  virtual void getPathName(CString &sPath);
+  /// Host: records the program file's path (never called by the library).
+  virtual void setPathName(const CString &sPath) = 0;
+  /// Host: whether its own data equals that of another configuration.
+  virtual bool bIsHostDataEqual(int nOtherHostData) const = 0;
+  /// Host: takes over another configuration's host data.
+  virtual void copyHostData(int nSourceHostData) = 0;
+  /// Host: marks the configuration as changed (never called by the library).
+  virtual void setModified(bool bModified) = 0;
+  virtual TConfigCompareResults compareConfiguration(const CRobotConfigurationBasic &other) const;
+  virtual void copyFrom(const CRobotConfigurationBasic &source);
+  /// Resets every UART to the platform default and every I2C port to unused.
+  virtual void clearUartAndI2CDefinition();
+  /// Removes VEX I2C encoder sensors that no motor uses.
+  virtual void clearUnusedVexI2CEncoders();
+  /// Brings the record to the state of a program without configuration lines
+  /// for the current platform and the board chosen in the IDE.
+  virtual void clearConfigurationDefinition();
+  /// Host: whether the configuration has changed (never called by the library).
+  virtual bool bIsModified() const = 0;
+
+ private:
+  /// Reader of "UserModel" lines; this version accepts nothing.
+  virtual bool bParseConfigDefinitionLineFileNameForUserModel(const TTokenizedConfigParms &parms, bool bFlag,
+                                                              TLineNumber line, const CString &sSourceFile,
+                                                              CString &sError);
+
+ protected:
+  /// Host: reads a "DatalogSeries" line (false + message = rejected).
+  virtual bool bParseConfigDefinitionLineDatalogSeries(const TTokenizedConfigParms &parms, bool bFlag,
+                                                       TLineNumber line, CString &sError) = 0;
+  /// Host: appends its "DatalogSeries" lines; true when it appended any.
+  virtual bool buildSourceCodeForDatalogSeries() = 0;
+
+ public:
+  const CRobotConfigurationBasic &operator=(const CRobotConfigurationBasic &source);
+  int operator==(const CRobotConfigurationBasic &other) const;
+  int operator!=(const CRobotConfigurationBasic &other) const;
+
+  // ---- Reading a program ------------------------------------------------
+  /// Classifies one source line and splits a configuration line into tokens.
+  static TTokenizedLineType nTokenizeLine(const CString &sLine, TTokenizedConfigParms &parms);
+  /// Reads one tokenized configuration line; false = rejected, message in sError.
+  bool bParseConfigDefinitionLine(const TTokenizedConfigParms &parms, bool bFlag, TLineNumber line,
+                                  const CString &sSourceFile, CString &sError);
+  void initializeMultiRobotNetworkDefinitionBeforeParsingConfiguration();
+  void normalizeValuesAfterParsingConfiguration();
+  void validateMultiRobotNetworkDefinitionAfterParsingConfiguration();
+
+  // ---- Writing a program -------------------------------------------------
+  /// Builds the configuration block; true when any writer wrote something.
+  bool buildSourceCodeForConfiguration(CString &sOutput, bool bSkipStandardModel);
+
+  // ---- Accessors -----------------------------------------------------------
+  int getSecondaryPort(int nPort) const { return settings.nSecondaryPorts[size_t(nPort)]; }
+  void getUserDefinedMotorNameInConfig(int nMotor, CString &sName) const { sName = sMotorNames[size_t(nMotor)]; }
+  void getUserDefinedServoNameInConfig(int nServo, CString &sName) const { sName = sServoNames[size_t(nServo)]; }
+  void getUserDefinedSensorNameInConfig(int nPort, CString &sName) const { sName = sSensorNames[size_t(nPort)]; }
+  TMotorTypes getMotorTypeInConfig(int nMotor) const { return settings.motors[size_t(nMotor)].nMotorType; }
+  bool getMotorReversedInConfig(int nMotor) const { return settings.motors[size_t(nMotor)].bReversed; }
+  void setMotorReversedInConfig(int nMotor, bool bReversed) { settings.motors[size_t(nMotor)].bReversed = bReversed; }
+  TMotorDriveSide getMotorDriveSideInConfig(int nMotor) const { return settings.motors[size_t(nMotor)].nDriveSide; }
+  void setMotorDriveSideInConfig(int nMotor, TMotorDriveSide nSide) { settings.motors[size_t(nMotor)].nDriveSide = nSide; }
+  bool getMotorPIDControlledInConfig(int nMotor) const { return settings.motors[size_t(nMotor)].bPIDControlled; }
+  void setMotorPIDControlledInConfig(int nMotor, bool bPID) { settings.motors[size_t(nMotor)].bPIDControlled = bPID; }
+  bool getMotorEncoderInConfig(int nMotor) const { return settings.motors[size_t(nMotor)].bEncoder; }
+  /// Turning the encoder off also turns PID control off.
+  void setMotorEncoderInConfig(int nMotor, bool bEncoder);
+  const TLineNumber &getMotorDefinitionLine(int nMotor) const { return parseInfo.motorDefinitionLines[size_t(nMotor)]; }
+  void setMotorDefinitionLine(int nMotor, const TLineNumber &line) { parseInfo.motorDefinitionLines[size_t(nMotor)] = line; }
+  TSensorTypes getSensorTypeInConfig(int nPort) const { return settings.nSensorTypes[size_t(nPort)]; }
+  TSensorModes getSensorModeInConfig(int nPort) const { return settings.nSensorModes[size_t(nPort)]; }
+  const TLineNumber &getSensorDefinitionLine(int nPort) const { return parseInfo.sensorDefinitionLines[size_t(nPort)]; }
+  void setSensorDefinitionLine(int nPort, const TLineNumber &line) { parseInfo.sensorDefinitionLines[size_t(nPort)] = line; }
+  TServoTypes getServoType(int nServo) const { return settings.nServoTypes[size_t(nServo)]; }
+  void setServoType(int nServo, TServoTypes nType) { settings.nServoTypes[size_t(nServo)] = nType; }
+  int getI2C_Address(int nPort) const { return settings.nI2CAddresses[size_t(nPort)]; }
+  void setI2C_Address(int nPort, int nAddress) { settings.nI2CAddresses[size_t(nPort)] = nAddress; }
+  const TLineNumber &getServoDefinitionLine(int nServo) const { return parseInfo.servoDefinitionLines[size_t(nServo)]; }
+  void setServoDefinitionLine(int nServo, const TLineNumber &line) { parseInfo.servoDefinitionLines[size_t(nServo)] = line; }
+  TSerialPortMode getUARTType(int nUart) const { return settings.nUARTMode[size_t(nUart)]; }
+  TBaudRate getBaudRate(int nUart) const { return settings.nUARTBaudRate[size_t(nUart)]; }
+  const TMotorIOPinsDefinition *getMotorIOPins() const { return settings.pMotorIOPinTable; }
+  const TMotorIOPinsDefinition *getMotorIOPin(int nRow) const { return settings.pMotorIOPinTable + nRow; }
+  int getNumbOfEntriesInMotorIOPinTable() const { return settings.nNumbOfEntriesInMotorIOPinTable; }
+  int getCpuClockSpeed() const { return settings.nCpuClockSpeed; }
+  void setCpuClockSpeed(unsigned nSpeed) { settings.nCpuClockSpeed = static_cast<int32_t>(nSpeed); }
+  TControllerBoardType getCircuitBoardType() const { return settings.nCircuitBoardType; }
+  const CString &getStandardModelName() const { return sStandardModelName; }
+  const CString &getModelNameUserFile() const { return sModelNameUserFile; }
+  TDriveTrainType getDriveTrainType() const { return settings.nDriveTrainType; }
+  TGripperArmType getGripperArmType() const { return settings.nGripperArmType; }
+  TJoystickDriveType getJoystickMotorDriveType() const { return settings.nJoystickMotorDriveType; }
+  TJoystickAxisScaling getJoystickMotorAxisScaling() const { return settings.nJoystickMotorAxisScaling; }
+
+  /// Motors of a drive-train type: 2 for types 1 and 2, 4 for 3, 4, 5 and 7,
+  /// 3 for 6, else 0.
+  static int getNumbOfMotorsForDriveTrain(TDriveTrainType nType);
+  /// Motors of a gripper-arm type: 4 for types 1 and 2, else 0.
+  static int getNumbOfMotorsForGripperArm(TGripperArmType nType);
+  int getNumbOfMotorsForDriveTrain() const { return getNumbOfMotorsForDriveTrain(settings.nDriveTrainType); }
+  int getNumbOfMotorsForGripperArm() const { return getNumbOfMotorsForGripperArm(settings.nGripperArmType); }
+
+  /// Read-only view of the plain-data blocks.
+  const TConfigurationSettings &getSettings() const { return settings; }
+  const TConfigurationParseInfo &getParseInfo() const { return parseInfo; }
+
+  // ---- Motor types ---------------------------------------------------------
+  TMotorTypes getDefaultMotorType(int nMotor) const;
+  TMotorTypes getMotorTypeWithOptionalAdjustForMotorTypeNone(int nMotor) const;
+  TMotorTypes adjustLegacyMotorNormalDeprecated(int nMotor);
+  void setMotorTypeInConfig(int nMotor, TMotorTypes nType);
+  void normalizeLegacyMotorConfiguration(int nMotor);
+  bool bGetDefaultEncoderSetting(int nMotor) const;
+  bool bGetDefaultPidControlSetting(int nMotor) const;
+  bool bGetDefaultMotorReversedSetting(int nMotor) const;
+
+  // ---- Default motor names ------------------------------------------------------
+  void getDefaultMotorNameLowLevel(int nMotor, CString &sName, bool bHubStyle) const;
+  void getDefaultMotorName(int nMotor, CString &sName) const { getDefaultMotorNameLowLevel(nMotor, sName, false); }
+  void getDefaultMotorNameAdjustedForTetrix(int nMotor, CString &sName) const {
+    getDefaultMotorNameLowLevel(nMotor, sName, true);
+  }
+  void getDefaultMotorNameForPlatformOrControllerBoard(int nMotor, CString &sName) const;
+  void updateDefaultMotorNameForPlatformOrControllerBoard(TMotorIndex nMotor, const wchar_t *pzName);
+  int getIndexForDefaultMotorName(const CString &sName) const;
+  void setUserDefinedMotorNameInConfig(int nMotor, const CString &sName, const TLineNumber &line);
+  void setEmptyMotorNameToDefaultName(int nMotor);
+
+  // ---- Motor ports, IO pins and hubs ---------------------------------------
+  bool bSharedPortsForMotorsAndSensors() const;
+  int getMaxNumbOfMotorPorts() const;
+  bool bIsValidMotorPort(int nMotor) const;
+  bool bIsValidServoPort(int nServo) const;
+  int getMotorMuxNumbOfMotors(TSensorPortHub nHub) const;
+  int getServoMuxNumbOfServos(TSensorPortHub nHub) const;
+  TSensorPortHub getMotorMuxForMotor(int nMotor) const;
+  TMotorIndex getDeviceIndexOnMotorHub(TSensorPortHub nHub, int nSensorPort, int nChainPosition, int nMotorOnHub) const;
+  TServoIndex getDeviceIndexOnServoHub(TSensorPortHub nHub, int nSensorPort, int nChainPosition, int nServoOnHub) const;
+  bool bSensorPortContainsHiTechnicMux(int nSensorPort) const;
+  const TMotorIOPinsDefinition *getMotorIOPinDefinition(int nMotor) const;
+  int getMapMotorToPrimaryIOPin(int nMotor) const { return settings.motors[size_t(nMotor)].nPrimaryIOPin; }
+  int getMapMotorToSecondaryIOPin(int nMotor) const { return settings.motors[size_t(nMotor)].nSecondaryIOPin; }
+  void setMotorIOPinsInConfig(int nMotor, int nPrimary, int nSecondary, bool bTwoPinType);
+  void setMotorIOPinsInConfigNone(int nMotor) { setMotorIOPinsInConfig(nMotor, -1, -1, false); }
+  void setMotorIOPins(const TMotorIOPinsDefinition *pTable, int nCount);
+  void setDefaultMotorIOPinsForControllerBoard();
+  void setDefaultMotorIOPinsForPlugInBoard(int nSlot);
+  void updateDefaultMotorNamesForIOPins();
+
+  // ---- Encoders --------------------------------------------------------------
+  int getMapEncoderToMotor(int nMotor) const { return settings.motors[size_t(nMotor)].nEncoderPort; }
+  void setMapEncoderToMotor(int nMotor, int nSensorPort);
+  void removeMotorEncodersForSensorPort(int nSensorPort);
+
+  // ---- Sensors -----------------------------------------------------------------
+  void setSensorTypeInConfig(int nPort, TSensorTypes nType);
+  void removeSensorTypeInConfig(int nPort);
+  void setSensorModeInConfig(int nPort, TSensorModes nMode) { settings.nSensorModes[size_t(nPort)] = nMode; }
+  void clearSensorTypeAndModeInConfig(int nPort);
+  void calculateI2CUsage();
+  void setUserDefinedSensorNameInConfig(int nPort, const CString &sName, const TLineNumber &line);
+  int getMaxNumbOfSensorPorts() const;
+  /// Sensor port of a port name of the configuration's board; negative when none.
+  int getIndexForSensorName(const CString &sName) const;
+
+  // ---- Boards ----------------------------------------------------------------------
+  void setDefaultFixedIOPinsForControllerBoard();
+
+  // ---- UART and I2C ports --------------------------------------------------------
+  TSerialPortMode getDefaultUartType(int nPort);
+  int getMaxNumbOfUARTPorts() const;
+  int getMaxNumbOfI2CPorts() const;
+  void getMapUARTPortToIOPins(int nPort, int &nFirstPin, int &nSecondPin) const;
+  void getMapI2CPortToIOPins(int nPort, int &nFirstPin, int &nSecondPin) const;
+  bool findUartFromPin(int nPin, int &nPort, int &nFirstPin, int &nSecondPin) const;
+  bool findI2CFromPin(int nPin, int &nPort, int &nFirstPin, int &nSecondPin) const;
+
+ protected:
+  /// Appends one line and "\r\n" to the generated text.
+  void addSourceLineToConfiguration(const CString &sLine);
+  /// Appends the generated-code comment line that closes the block.
+  void addCommentLineForCodeAutomaticallyGeneratedByConfigurationWizard();
+  /// Appends an empty line.
+  void addBlankLineToConfiguration();
+
+ private:
+  /// Dispatches a line of a known keyword to its reader.
+  bool bParseConfigLineOfType(TConfigTypes nType, const TTokenizedConfigParms &parms, bool bFlag, TLineNumber line,
+                              const CString &sSourceFile, CString &sError);
+  /// Reader of the "CPU_Parameters" line.
+  bool bParseConfigDefinitionLineCpuParameters(const TTokenizedConfigParms &parms, CString &sError);
+  /// Reader of the "Analog" line.
+  bool bParseConfigDefinitionLineAnalog(const TTokenizedConfigParms &parms, CString &sError);
+
+  bool buildSourceCodeForOptions();
+  /// Writes the standard-model lines; false when no standard model is used.
+  bool buildSourceCodeForStandardModel();
+  void buildSourceCodeForFileNameForUserModelLowLevel();
+  /// Writes "CPU_Parameters" when the clock differs from the board's default.
+  bool buildSourceCodeForCpuTypeAndClockSpeed();
+  /// Writes the "RenamedStdModelMotor" line of a motor.
+  void buildSourceCodeForRenameMotor(int nMotor);
+  /// Writes the "RenamedStdModelSensor" line of a sensor port.
+  void buildSourceCodeForRenameSensor(int nPort);
+
+  /// The writers run for the individual lines, in this order; see SourceGeneration.cpp.
+  typedef bool (CRobotConfigurationBasic::*TSourceWriter)();
+
+  /// Calls the record's own clear (not through the virtual table).
+  void clearConfigurationDefinitionLowLevel();
+  /// Copies the board's default motor names from its pin table.
+  void copyBoardDefaultMotorNamesFromPinTable();
+  /// Default UART modes and I2C usage (the record's own version).
+  void clearUartAndI2CDefinitionLowLevel();
+
+ public:
+  // ---- Members, in declaration order ----------------------------------------------
+  int32_t nHostData;
+  std::array<CString, kMaxNumbOfMotors> sBoardDefaultMotorNames;
+  std::array<CString, kMaxNumbOfSensorPorts> sDefaultSensorNames;
+  std::array<CString, kMaxNumbOfMotors> sMotorNames;
+  std::array<CString, kMaxNumbOfSensorPorts> sSensorNames;
+  std::array<CString, kMaxNumbOfServos> sServoNames;
+  CString sStandardModelName;
+  CString sModelNameUserFile;
+  std::array<CString, kMaxNumbOfServoPositionSets> sServoPositionNames;
+  std::array<TLineNumber, kMaxNumbOfMotors> motorNameLines;
+  std::array<TLineNumber, kMaxNumbOfSensorPorts> sensorNameLines;
+  std::array<TLineNumber, kMaxNumbOfServos> servoNameLines;
+  Networking::CNtwkInfoFromPragmas *pNtwkInfo;
+  TConfigurationSettings settings;
+  TConfigurationParseInfo parseInfo;
+  bool bHubDefaultNamesConfigured;
+  CString sSourceCode;
+  bool bDigitalPortWarningShown;
+  bool bQuadPortErrorShown;
+};

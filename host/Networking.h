@@ -1,0 +1,62 @@
+// Network-definition service: the multi-robot network that one program's
+// configuration belongs to.
+#pragma once
+
+#include <array>
+#include <cstdint>
+
+#include "host/CString.h"
+#include "host/HostMessages.h"
+#include "host/LineNumber.h"
+
+namespace Networking {
+
+typedef int32_t TNtwkType;          ///< network type, negative = none
+typedef int32_t THardwareVersions;  ///< radio hardware version
+
+/// Most node entries one network definition keeps.
+constexpr int kMaxNodesInNetwork = 9;
+/// Network number of "no network".
+constexpr uint16_t kNoNetworkNumber = 0xFFFF;
+
+/// One radio node of a network definition.
+struct TNtwkNodeInfo {
+  CString sNodeName;
+  std::array<unsigned char, 8> nSerialNumber{};
+  THardwareVersions nHardwareVersion = 0;
+  TDateField date{0, 0};
+  TLineNumber definitionLine;
+
+  void setNodeName(const CString &sName) { sNodeName = sName; }
+  bool operator==(const TNtwkNodeInfo &o) const;
+};
+
+/// The network definition read from a program's configuration lines.
+class CNtwkInfoFromPragmas {
+ public:
+  CNtwkInfoFromPragmas() { initializeEmpty(); }
+
+  /// Leaves no network: number 0xFFFF, no nodes, nothing defined.
+  void initializeEmpty();
+  void setNetworkName(const CString &sName) { sNetworkName = sName; }
+  void setNetworkNumber(unsigned short nNumber) { nNetworkNumber = nNumber; }
+  unsigned short getNetworkNumber() const { return nNetworkNumber; }
+  void setPrimaryNodeAddress(const unsigned char (&address)[8]);
+  void getPrimaryNode(unsigned char (&address)[8]) const;
+
+  bool operator==(const CNtwkInfoFromPragmas &o) const;
+  bool operator!=(const CNtwkInfoFromPragmas &o) const { return !(*this == o); }
+
+  uint8_t bDefined = 0;
+  CString sNetworkName;
+  uint8_t nChannel = 0;
+  TNtwkType nNetworkType = 0;
+  TDateField date{0, 0};
+  TLineNumber definitionLine;
+  int32_t nNumbOfNodes = 0;
+  std::array<TNtwkNodeInfo, kMaxNodesInNetwork> nodes;
+  uint16_t nNetworkNumber = kNoNetworkNumber;
+  std::array<unsigned char, 8> nPrimaryNodeAddress{};
+};
+
+}  // namespace Networking

@@ -1,0 +1,14 @@
+#include "core/RobotConfiguration.h"
+
+void CRobotConfigurationBasic::setMapEncoderToMotor(int nMotor, int nSensorPort) {
+  settings.motors[size_t(nMotor)].nEncoderPort = nSensorPort < 0 ? -1 : nSensorPort;
+}
+
+void CRobotConfigurationBasic::removeMotorEncodersForSensorPort(int nSensorPort) {
+  for (TMotorSlot &motor : settings.motors)
+    if (motor.nEncoderPort == nSensorPort) {
+      motor.nEncoderPort = -1;
+      motor.bEncoder = false;
+      motor.bPIDControlled = false;
+    }
+}

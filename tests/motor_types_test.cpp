@@ -1,0 +1,332 @@
+// Motor types per platform, motor ports and hubs, IO pins and default motor names.
+#include <gtest/gtest.h>
+
+#include <cstring>
+#include <set>
+#include <string>
+
+#include "host/HostConfiguration.h"
+#include "host/Platform.h"
+#include "motors/MotorTypes.h"
+
+namespace {
+
+class MotorRules : public ::testing::Test {
+ protected:
+  CHostSelectionScope scope;
+};
+
+std::set<int> typesWithRows() {
+  std::set<int> types;
+  for (int nType = 0; nType < kNumbOfMotorTypes; ++nType)
+    if (getMotorCharacteristics(nType)) types.insert(nType);
+  return types;
+}
+
+std::wstring defaultName(const CRobotConfigurationBasic &rec, int nMotor, bool bHubStyle) {
+  CString sName(L"stale");
+  rec.getDefaultMotorNameLowLevel(nMotor, sName, bHubStyle);
+  return sName.str();
+}
+
+TEST_F(MotorRules, CharacteristicsDependOnPlatformAndToggle) {
+  selectHostPlatform(platformArduino);
+  EXPECT_EQ(typesWithRows(), (std::set<int>{0, 1, 2, 3, 5, 16, 22, 23, 24, 25, 29}));
+  EXPECT_EQ(getMotorCharacteristics(17), nullptr);
+  EXPECT_EQ(resolveMotorTypeForPlatform(17), 3);
+
+  selectHostPlatform(platformKind9);
+  EXPECT_EQ(typesWithRows(), (std::set<int>{0, 2, 3, 4, 5, 26, 29}));
+  EXPECT_EQ(resolveMotorTypeForPlatform(17), 0);  // its replacement 15 has no row either
+
+  selectHostPlatform(platformNxt);
+  EXPECT_EQ(typesWithRows(), (std::set<int>{0, 17, 20, 21, 26, 27, 28, 29}));
+  ASSERT_NE(getMotorCharacteristics(26), nullptr);
+  EXPECT_EQ(getMotorCharacteristics(26)->bDefaultEncoder, 1);
+  EXPECT_EQ(getRawMotorCharacteristics(26), getMotorCharacteristics(26));
+  // The toggle guards rows on the same platform: the lookup must follow it.
+  setHostExternalControllers(true);
+  EXPECT_EQ(typesWithRows(), (std::set<int>{0, 2, 3, 17, 20, 21, 26, 27, 28, 29, 30, 31}));
+  setHostExternalControllers(false);
+  EXPECT_EQ(getMotorCharacteristics(30), nullptr);
+
+  selectHostPlatform(platformVexI2c);
+  ASSERT_NE(getMotorCharacteristics(26), nullptr);
+  EXPECT_EQ(getMotorCharacteristics(26)->bDefaultEncoder, 0);
+
+  for (int nKind = 0; nKind < kNumbOfPlatformKinds; ++nKind) {
+    SCOPED_TRACE(nKind);
+    selectHostPlatform(nKind);
+    const bool bRowsForTwoPinTypes = ((1u << nKind) & 0x29Cu) != 0;
+    EXPECT_EQ(getMotorCharacteristics(2) != nullptr, bRowsForTwoPinTypes);
+    EXPECT_EQ(getMotorCharacteristics(3) != nullptr, bRowsForTwoPinTypes);
+    EXPECT_EQ(getMotorCharacteristics(30), nullptr);
+    EXPECT_EQ(getMotorCharacteristics(31), nullptr);
+    EXPECT_EQ(getMotorCharacteristics(-1), nullptr);
+    EXPECT_EQ(getMotorCharacteristics(32), nullptr);
+    for (int nType = 0; nType < kNumbOfMotorTypes; ++nType) {
+      ASSERT_NE(getMotorConversion(nType), nullptr);
+      EXPECT_EQ(getMotorConversion(nType)->nSourceType, nType);
+    }
+  }
+}
+
+TEST_F(MotorRules, TypesReadFromLinesResolvePerPlatform) {
+  struct TCase {
+    int nKind;
+    TMotorTypes nType, nResolved;
+  };
+  const TCase kCases[] = {
+      {platformNxt, 18, 17},   {platformNxt, 19, 17},       {platformNxt, 4, 0},
+      {platformBrick4Motor, 19, 19}, {platformBrick4Motor, 17, 17}, {platformVexPic, 6, 10},
+      {platformVexI2c, 17, 3}, {platformSharedPorts, 17, 14}, {platformSharedPorts, 3, 3},
+      {platformArduino, 4, 5}, {platformBoard12, 1, 1},      {platformNone, 17, 0},
+      {platformKind5, 3, 0},   {platformVexPic, 26, 26},     {platformVexPic, 30, 0},
+  };
+  for (const TCase &c : kCases) {
+    selectHostPlatform(c.nKind);
+    EXPECT_EQ(resolveMotorTypeForPlatform(c.nType), c.nResolved) << "kind " << c.nKind << " type " << c.nType;
+  }
+}
+
+TEST_F(MotorRules, DefaultTypes) {
+  selectHostPlatform(platformNxt, -1, true);
+  CHostRobotConfiguration rec;
+  EXPECT_EQ(rec.getDefaultMotorType(2), 17);
+  EXPECT_EQ(rec.getDefaultMotorType(3), 0);
+  rec.settings.nSensorPortHubs[0][0] = hubHTMotor;
+  EXPECT_EQ(rec.getDefaultMotorType(3), 20);
+  rec.settings.nSensorPortHubs[0][0] = hubMatrxRbtcs;
+  EXPECT_EQ(rec.getDefaultMotorType(3), 21);
+
+  // A slot of type 0 reports the default type only where the port exists on a brick.
+  rec.settings.motors[0].nMotorType = 0;
+  EXPECT_EQ(rec.getMotorTypeWithOptionalAdjustForMotorTypeNone(0), 17);
+  EXPECT_EQ(rec.getMotorTypeWithOptionalAdjustForMotorTypeNone(20), 0);
+  EXPECT_EQ(rec.getMotorTypeInConfig(0), 0);
+
+  const std::pair<int, TMotorTypes> kDefaults[] = {{platformBrick4Motor, 18}, {platformSharedPorts, 14},
+                                                   {platformKind9, 15},       {platformVexPic, 3},
+                                                   {platformNone, 3},         {platformBoard14, 3}};
+  for (const auto &[nKind, nType] : kDefaults) {
+    selectHostPlatform(nKind);
+    CHostRobotConfiguration other;
+    EXPECT_EQ(other.getDefaultMotorType(3), nType) << nKind;
+    EXPECT_EQ(other.getMotorTypeWithOptionalAdjustForMotorTypeNone(3), nKind == platformBrick4Motor ? 18 : 0);
+  }
+}
+
+TEST_F(MotorRules, LegacyTypesAreNormalised) {
+  selectHostPlatform(platformNxt, -1, true);
+  CHostRobotConfiguration rec;
+  auto normalise = [&rec](TMotorTypes nType, bool bEncoder) {
+    TMotorSlot &motor = rec.settings.motors[5];
+    motor.nMotorType = nType;
+    motor.bEncoder = bEncoder;
+    motor.bPIDControlled = true;
+    motor.bReversed = true;
+    rec.normalizeLegacyMotorConfiguration(5);
+    return motor;
+  };
+  TMotorSlot m = normalise(28, false);
+  EXPECT_EQ(m.nMotorType, 17);
+  EXPECT_TRUE(m.bPIDControlled);
+  EXPECT_FALSE(m.bReversed);
+  EXPECT_FALSE(m.bEncoder);
+
+  m = normalise(29, true);
+  EXPECT_EQ(m.nMotorType, 17);
+  EXPECT_FALSE(m.bPIDControlled);
+  EXPECT_TRUE(m.bReversed);
+  EXPECT_TRUE(m.bEncoder);
+
+  m = normalise(26, true);
+  EXPECT_EQ(m.nMotorType, 17);
+  EXPECT_FALSE(m.bPIDControlled);
+
+  m = normalise(31, true);
+  EXPECT_EQ(m.nMotorType, 20);
+  EXPECT_TRUE(m.bPIDControlled);
+
+  for (const TMotorTypes nType : {15, -1, 40}) {
+    m = normalise(nType, true);
+    EXPECT_EQ(m.nMotorType, 0) << nType;
+    EXPECT_FALSE(m.bPIDControlled);
+    EXPECT_FALSE(m.bReversed);
+  }
+
+  // Modern types keep their flags; the plain types take their row's defaults.
+  m = normalise(20, false);
+  EXPECT_EQ(m.nMotorType, 20);
+  EXPECT_TRUE(m.bPIDControlled);
+  EXPECT_TRUE(m.bReversed);
+  selectHostPlatform(platformVexPic);
+  rec.clearConfigurationDefinition();
+  m = normalise(5, false);
+  EXPECT_EQ(m.nMotorType, 5);
+  EXPECT_TRUE(m.bReversed);
+  EXPECT_FALSE(m.bPIDControlled);
+}
+
+TEST_F(MotorRules, SettingATypeResetsFlagsAndFreesDriveTrainSlots) {
+  selectHostPlatform(platformNxt);
+  CHostRobotConfiguration rec;
+  rec.settings.nDriveTrainMotorIndex = {1, 2, 1, 255};
+  rec.parseInfo.bMotorListIndexMappingBuilt = true;
+  TMotorSlot &motor = rec.settings.motors[1];
+  motor.bPIDControlled = false;
+  motor.bReversed = true;
+  motor.pidSettings.clearPidSettings();
+
+  // The same type again: the mapping stays valid, the flags return to the type's defaults.
+  rec.setMotorTypeInConfig(1, 17);
+  EXPECT_TRUE(rec.getParseInfo().bMotorListIndexMappingBuilt);
+  EXPECT_TRUE(motor.bPIDControlled);
+  EXPECT_FALSE(motor.bReversed);
+  EXPECT_TRUE(motor.pidSettings.bIdenticalPidSettings(*pToggles->getDefaultPidSettings(17)));
+
+  rec.setMotorTypeInConfig(1, 29);
+  EXPECT_FALSE(rec.getParseInfo().bMotorListIndexMappingBuilt);
+  EXPECT_TRUE(motor.bReversed);
+  EXPECT_EQ(rec.getSettings().nDriveTrainMotorIndex, (std::array<uint8_t, 4>{1, 2, 1, 255}));
+  rec.setMotorTypeInConfig(1, 0);
+  EXPECT_EQ(rec.getSettings().nDriveTrainMotorIndex, (std::array<uint8_t, 4>{255, 2, 255, 255}));
+
+  rec.setMotorEncoderInConfig(0, false);
+  EXPECT_FALSE(rec.getMotorPIDControlledInConfig(0));
+
+  // On shared ports a motor claims the sensor port of its index, once per change of type.
+  selectHostPlatform(platformSharedPorts);
+  rec.clearConfigurationDefinition();
+  rec.setMotorTypeInConfig(2, 14);
+  EXPECT_EQ(rec.getSensorTypeInConfig(2), 91);
+  rec.settings.nSensorTypes[2] = 5;
+  rec.setMotorTypeInConfig(2, 14);
+  EXPECT_EQ(rec.getSensorTypeInConfig(2), 5);
+  rec.settings.nSensorTypes[2] = 91;
+  rec.setMotorTypeInConfig(2, 0);
+  EXPECT_EQ(rec.getSensorTypeInConfig(2), 0);
+}
+
+TEST_F(MotorRules, HubMotorAndServoNumbering) {
+  selectHostPlatform(platformNxt);
+  CHostRobotConfiguration rec;
+  rec.settings.nSensorPortHubs[0] = {hubHTMotor, hubHTMotor, hubNone, hubHTMotor};
+  for (int n = 0; n <= 6; ++n) EXPECT_TRUE(rec.bIsValidMotorPort(n)) << n;
+  EXPECT_FALSE(rec.bIsValidMotorPort(7));  // behind the end of the chain
+  EXPECT_FALSE(rec.bIsValidMotorPort(9));
+  EXPECT_FALSE(rec.bIsValidMotorPort(-1));
+  EXPECT_EQ(rec.getDeviceIndexOnMotorHub(hubHTMotor, 0, 1, 1), 6);
+  EXPECT_EQ(rec.getDeviceIndexOnMotorHub(hubHTServo, 0, 1, 1), -1);
+  EXPECT_EQ(rec.getMotorMuxForMotor(6), hubHTMotor);
+  EXPECT_EQ(rec.getMotorMuxForMotor(2), hubNone);
+
+  // A chain that starts empty holds no motors, though the port holds a controller.
+  rec.settings.nSensorPortHubs[0] = {hubNone, hubHTMotor, hubNone, hubNone};
+  for (int n = 3; n <= 10; ++n) EXPECT_FALSE(rec.bIsValidMotorPort(n)) << n;
+  EXPECT_TRUE(rec.bSensorPortContainsHiTechnicMux(0));
+  EXPECT_FALSE(rec.bSensorPortContainsHiTechnicMux(1));
+
+  selectHostPlatform(platformBrick4Motor);
+  rec.clearConfigurationDefinition();
+  rec.settings.nSensorPortHubs[1][0] = hubMatrxRbtcs;
+  for (int n = 12; n <= 15; ++n) EXPECT_TRUE(rec.bIsValidMotorPort(n)) << n;
+  EXPECT_FALSE(rec.bIsValidMotorPort(11));
+  EXPECT_FALSE(rec.bIsValidMotorPort(16));
+  EXPECT_EQ(rec.getMotorMuxForMotor(13), hubMatrxRbtcs);
+  EXPECT_EQ(rec.getDefaultMotorType(13), 21);
+
+  selectHostPlatform(platformNxt, -1, true);
+  rec.clearConfigurationDefinition();
+  rec.settings.nSensorPortHubs[2] = {hubHTServo, hubHTServo, hubNone, hubNone};
+  EXPECT_FALSE(rec.bIsValidServoPort(47));
+  for (int n = 48; n <= 59; ++n) EXPECT_TRUE(rec.bIsValidServoPort(n)) << n;
+  EXPECT_FALSE(rec.bIsValidServoPort(60));
+  setHostExternalControllers(false);
+  EXPECT_FALSE(rec.bIsValidServoPort(48));
+
+  selectHostPlatform(platformVexPic);
+  EXPECT_EQ(rec.getDeviceIndexOnMotorHub(hubHTMotor, 0, 0, 0), -1);
+  EXPECT_EQ(std::wstring(getMuxTypes(3)), L"MatrxRbtcs");
+  EXPECT_EQ(std::wstring(getMuxTypes(6)), L"none");
+}
+
+TEST_F(MotorRules, MotorIOPinsClaimSensorPorts) {
+  selectHostPlatform(platformArduino);
+  CHostRobotConfiguration rec;
+  rec.setMotorIOPinsInConfig(2, 5, 4, false);
+  EXPECT_EQ(rec.getSensorTypeInConfig(5), 57);
+  EXPECT_EQ(rec.getSensorTypeInConfig(4), 58);
+  EXPECT_EQ(rec.getMapMotorToPrimaryIOPin(2), 5);
+  EXPECT_EQ(rec.getMapMotorToSecondaryIOPin(2), 4);
+
+  const TConfigurationSettings before = rec.getSettings();
+  rec.setMotorIOPinsInConfig(2, 5, 4, false);
+  EXPECT_EQ(std::memcmp(&before, &rec.getSettings(), sizeof before), 0);
+
+  // Moving one pin frees only that pin.
+  rec.setMotorIOPinsInConfig(2, 8, 4, false);
+  EXPECT_EQ(rec.getSensorTypeInConfig(5), 0);
+  EXPECT_EQ(rec.getSensorTypeInConfig(8), 57);
+  EXPECT_EQ(rec.getSensorTypeInConfig(4), 58);
+
+  rec.setMotorIOPinsInConfigNone(2);
+  EXPECT_EQ(rec.getSensorTypeInConfig(8), 0);
+  EXPECT_EQ(rec.getSensorTypeInConfig(4), 0);
+  EXPECT_EQ(rec.getMapMotorToPrimaryIOPin(2), -1);
+  EXPECT_EQ(rec.getMapMotorToSecondaryIOPin(2), -1);
+
+  rec.setMotorIOPinsInConfig(3, 9, 10, true);
+  EXPECT_EQ(rec.getSensorTypeInConfig(9), 59);
+  EXPECT_EQ(rec.getSensorTypeInConfig(10), 59);
+}
+
+TEST_F(MotorRules, DefaultMotorNames) {
+  selectHostPlatform(platformVexPic);
+  CHostRobotConfiguration rec;
+  EXPECT_EQ(defaultName(rec, 0, false), L"port1");
+  selectHostPlatform(platformSharedPorts);
+  EXPECT_EQ(defaultName(rec, 9, false), L"motor10");
+  selectHostPlatform(platformArduino);
+  EXPECT_EQ(defaultName(rec, 0, true), L"");
+
+  selectHostPlatform(platformBrick4Motor);
+  rec.clearConfigurationDefinition();
+  EXPECT_EQ(defaultName(rec, 3, false), L"motorD");
+  EXPECT_EQ(defaultName(rec, 4, true), L"");
+  rec.settings.nSensorPortHubs[0][0] = hubHTMotor;
+  EXPECT_EQ(defaultName(rec, 4, true), L"mtr_S1_C1_1");
+  EXPECT_EQ(defaultName(rec, 4, false), L"motorE");
+
+  // Lettered names run on without gaps over the hub motors that exist.
+  selectHostPlatform(platformNxt);
+  rec.clearConfigurationDefinition();
+  rec.settings.nSensorPortHubs[0] = {hubHTMotor, hubHTMotor, hubNone, hubNone};
+  rec.settings.nSensorPortHubs[1][0] = hubMatrxRbtcs;
+  const std::pair<int, const wchar_t *> kLettered[] = {{3, L"motorD"},  {4, L"motorE"},  {5, L"motorF"},
+                                                       {6, L"motorG"},  {7, L""},        {11, L"motorH"},
+                                                       {12, L"motorI"}, {13, L"motorJ"}, {14, L"motorK"},
+                                                       {15, L""}};
+  for (const auto &[nMotor, pzName] : kLettered) EXPECT_EQ(defaultName(rec, nMotor, false), pzName) << nMotor;
+  EXPECT_EQ(defaultName(rec, 5, true), L"mtr_S1_C2_1");
+  EXPECT_EQ(defaultName(rec, 13, true), L"mtr_Matrix_S2_3");
+
+  EXPECT_EQ(rec.getIndexForDefaultMotorName(L"motorB"), 1);
+  EXPECT_EQ(rec.getIndexForDefaultMotorName(L""), -1);
+  rec.setEmptyMotorNameToDefaultName(4);
+  EXPECT_EQ(rec.sMotorNames[4], L"motorE");
+  EXPECT_EQ(rec.motorNameLines[4], emptyLineNumber);
+
+  // On a board the pin table names the ports; the first of two equal names wins.
+  selectHostPlatform(platformArduino, 28);
+  rec.clearConfigurationDefinition();
+  CString sPort;
+  rec.getDefaultMotorNameForPlatformOrControllerBoard(0, sPort);
+  EXPECT_EQ(sPort, L"motor_5");
+  EXPECT_EQ(rec.getIndexForDefaultMotorName(L"servo_C"), 6);
+  rec.settings.motors[0].nMotorType = 1;
+  rec.setEmptyMotorNameToDefaultName(0);
+  EXPECT_TRUE(rec.sMotorNames[0].IsEmpty());
+}
+
+}  // namespace
