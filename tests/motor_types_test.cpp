@@ -80,7 +80,7 @@ TEST_F(MotorRules, TypesReadFromLinesResolvePerPlatform) {
       {platformNxt, 18, 17},   {platformNxt, 19, 17},       {platformNxt, 4, 0},
       {platformBrick4Motor, 19, 19}, {platformBrick4Motor, 17, 17}, {platformVexPic, 6, 10},
       {platformVexI2c, 17, 3}, {platformSharedPorts, 17, 14}, {platformSharedPorts, 3, 3},
-      {platformArduino, 4, 5}, {platformBoard12, 1, 1},      {platformNone, 17, 0},
+      {platformArduino, 4, 5}, {platformBoard12, 3, 0},      {platformNone, 17, 0},
       {platformKind5, 3, 0},   {platformVexPic, 26, 26},     {platformVexPic, 30, 0},
   };
   for (const TCase &c : kCases) {
@@ -324,9 +324,16 @@ TEST_F(MotorRules, DefaultMotorNames) {
   rec.getDefaultMotorNameForPlatformOrControllerBoard(0, sPort);
   EXPECT_EQ(sPort, L"motor_5");
   EXPECT_EQ(rec.getIndexForDefaultMotorName(L"servo_C"), 6);
+
+  // An audio motor never takes a default name.
+  selectHostPlatform(platformVexPic);
+  rec.clearConfigurationDefinition();
   rec.settings.motors[0].nMotorType = 1;
+  rec.settings.motors[1].nMotorType = 3;
   rec.setEmptyMotorNameToDefaultName(0);
+  rec.setEmptyMotorNameToDefaultName(1);
   EXPECT_TRUE(rec.sMotorNames[0].IsEmpty());
+  EXPECT_EQ(rec.sMotorNames[1], L"port2");
 }
 
 }  // namespace
