@@ -6,7 +6,7 @@ GENERATOR := $(shell command -v ninja >/dev/null 2>&1 && echo "-G Ninja")
 JOBS ?= $(shell nproc 2>/dev/null || echo 2)
 ROBOTCFG = ./$(BUILD_DIR)/robotcfg
 
-.PHONY: all build demo test asan-test ci clean deps
+.PHONY: all build demo test asan-test ci clean deps goldens
 
 all: build
 
@@ -44,3 +44,12 @@ ci:
 
 clean:
 	rm -rf $(BUILD_DIR) $(ASAN_BUILD_DIR)
+
+# Rewrites the expected outputs of the example programs from the current tool;
+# review the diff before committing it.
+goldens: build
+	@for dir in examples/*/; do \
+	  opts=$$(cat $$dir/options); \
+	  $(ROBOTCFG) check $$opts $${dir}program.c 2> $${dir}expected-check.txt || true; \
+	  $(ROBOTCFG) format $$opts $${dir}program.c > $${dir}expected-format.c 2>/dev/null || true; \
+	done

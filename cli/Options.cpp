@@ -84,6 +84,7 @@ TControllerBoardType findBoard(const std::string &sText) {
 bool parseOptions(int argc, char **argv, TOptions &options, std::string &sError) {
   bool bOptionsEnded = false;
   std::string sPlatform, sBoard;
+  bool bPlatformGiven = false, bBoardGiven = false;
   for (int i = 1; i < argc; ++i) {
     std::string sArg = argv[i];
     if (!bOptionsEnded && sArg.size() > 1 && sArg[0] == '-') {
@@ -115,8 +116,10 @@ bool parseOptions(int argc, char **argv, TOptions &options, std::string &sError)
       else if (sArg == "--external-controllers") options.bExternalControllers = true;
       else if (sArg == "--platform") {
         if (!takeValue(sPlatform)) return false;
+        bPlatformGiven = true;
       } else if (sArg == "--board") {
         if (!takeValue(sBoard)) return false;
+        bBoardGiven = true;
       } else {
         sError = "unknown option '" + sArg + "'";
         return false;
@@ -140,18 +143,18 @@ bool parseOptions(int argc, char **argv, TOptions &options, std::string &sError)
   }
   if (options.bHelp || options.bVersion) return true;
 
-  if (sPlatform.empty()) {
+  if (!bPlatformGiven) {
     const char *pzEnv = std::getenv("ROBOTCFG_PLATFORM");
     if (pzEnv && *pzEnv) sPlatform = pzEnv;
   }
-  if (!sPlatform.empty()) {
+  if (bPlatformGiven || !sPlatform.empty()) {
     options.nPlatformKind = findPlatformKind(sPlatform);
     if (options.nPlatformKind < 0) {
       sError = "unknown platform '" + sPlatform + "'";
       return false;
     }
   }
-  if (!sBoard.empty()) {
+  if (bBoardGiven) {
     options.nBoard = findBoard(sBoard);
     if (options.nBoard < 0) {
       sError = "unknown board '" + sBoard + "'";

@@ -1,5 +1,7 @@
 // robotcfg: checks, formats and shows the configuration block of robot programs.
+#include <cerrno>
 #include <cstdio>
+#include <cstring>
 #include <string>
 
 #include "cli/Commands.h"
@@ -26,12 +28,18 @@ int main(int argc, char **argv) {
     return kExitOk;
   }
   selectHostPlatform(options.nPlatformKind, options.nBoard, options.bExternalControllers);
+  int nStatus = kExitUsage;
   switch (options.nCommand) {
-    case TCommand::kCheck: return runCheck(options);
-    case TCommand::kFormat: return runFormat(options);
-    case TCommand::kGenerate: return runGenerate(options);
-    case TCommand::kShow: return runShow(options);
+    case TCommand::kCheck: nStatus = runCheck(options); break;
+    case TCommand::kFormat: nStatus = runFormat(options); break;
+    case TCommand::kGenerate: nStatus = runGenerate(options); break;
+    case TCommand::kShow: nStatus = runShow(options); break;
     case TCommand::kNone: break;
   }
-  return kExitUsage;
+  // Output that could not be written (a full disk, a closed pipe) is an I/O error.
+  if (std::fflush(stdout) != 0 || std::ferror(stdout)) {
+    std::fprintf(stderr, "robotcfg: cannot write standard output: %s\n", std::strerror(errno));
+    return kExitUsage;
+  }
+  return nStatus;
 }

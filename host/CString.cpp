@@ -1,17 +1,26 @@
 #include "host/CString.h"
 
 #include <algorithm>
+#include <cwchar>
 #include <cwctype>
 
 namespace robotconfig_detail {
 
-TFormatArg makeFormatArg(const CString &s) { return makeFormatArg(s.GetString()); }
-TFormatArg makeFormatArg(const std::wstring &s) { return makeFormatArg(s.c_str()); }
+TFormatArg makeFormatArg(const CString &s) { return makeFormatArg(s.str()); }
+
+TFormatArg makeFormatArg(const std::wstring &s) {
+  TFormatArg arg;
+  arg.nKind = TFormatArg::Kind::kString;
+  arg.pzString = s.c_str();
+  arg.nStringLength = s.size();
+  return arg;
+}
 
 TFormatArg makeFormatArg(const wchar_t *pz) {
   TFormatArg arg;
   arg.nKind = TFormatArg::Kind::kString;
   arg.pzString = pz;
+  arg.nStringLength = pz ? std::wcslen(pz) : 0;
   return arg;
 }
 
@@ -76,7 +85,7 @@ std::wstring digits(unsigned long long value, unsigned base, bool bUpper, int nM
 std::wstring stringOf(const TFormatArg &arg) {
   switch (arg.nKind) {
     case TFormatArg::Kind::kString:
-      return arg.pzString ? std::wstring(arg.pzString) : std::wstring(L"(null)");
+      return arg.pzString ? std::wstring(arg.pzString, arg.nStringLength) : std::wstring(L"(null)");
     case TFormatArg::Kind::kChar:
       return std::wstring(1, arg.cChar);
     case TFormatArg::Kind::kSigned:

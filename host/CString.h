@@ -21,6 +21,7 @@ struct TFormatArg {
   unsigned long long nUnsigned = 0;
   wchar_t cChar = 0;
   const wchar_t *pzString = nullptr;
+  size_t nStringLength = 0;  ///< characters of pzString; strings may hold NULs
   double fDouble = 0.0;
 };
 

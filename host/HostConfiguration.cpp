@@ -17,7 +17,10 @@ bool bNeedsQuotes(const CString &sParm) {
 void CHostRobotConfiguration::copyFrom(const CRobotConfigurationBasic &source) {
   CRobotConfigurationBasic::copyFrom(source);
   if (const auto *pHost = dynamic_cast<const CHostRobotConfiguration *>(&source)) {
-    if (pHost != this) m_datalogSeries = pHost->m_datalogSeries;
+    if (pHost != this) {
+      m_datalogSeries = pHost->m_datalogSeries;
+      m_nSeriesHash = pHost->m_nSeriesHash;
+    }
   }
 }
 
@@ -62,20 +65,28 @@ bool CHostRobotConfiguration::bParseConfigDefinitionLineFileNameForUserModel(con
     sError = L"Missing user model file name";
     return false;
   }
+  // The name is written back between double quotes, so it cannot hold one.
+  if (sFile.Find(L'"') >= 0) {
+    sError.Format(L"User model file name '%s' cannot contain a double quote", sFile);
+    return false;
+  }
   sModelNameUserFile = sFile;
   return true;
 }
 
 void CHostRobotConfiguration::updateHostDataFingerprint() {
-  // FNV-1a over the series' characters, with separators between parameters.
-  uint32_t nHash = 2166136261u;
-  auto mix = [&nHash](uint32_t c) { nHash = (nHash ^ c) * 16777619u; };
-  for (const std::vector<CString> &series : m_datalogSeries) {
-    for (const CString &sParm : series) {
-      for (int i = 0; i < sParm.GetLength(); ++i) mix(static_cast<uint32_t>(sParm[i]));
-      mix(0x1F);
-    }
-    mix(0x1E);
+  // FNV-1a, carried on from series to series so that reading stays linear.
+  constexpr uint32_t kOffsetBasis = 2166136261u;
+  if (m_datalogSeries.empty()) {
+    m_nSeriesHash = kOffsetBasis;
+    nHostData = 0;
+    return;
   }
-  nHostData = m_datalogSeries.empty() ? 0 : static_cast<int32_t>(nHash);
+  auto mix = [this](uint32_t c) { m_nSeriesHash = (m_nSeriesHash ^ c) * 16777619u; };
+  for (const CString &sParm : m_datalogSeries.back()) {
+    for (int i = 0; i < sParm.GetLength(); ++i) mix(static_cast<uint32_t>(sParm[i]));
+    mix(0x1F);
+  }
+  mix(0x1E);
+  nHostData = static_cast<int32_t>(m_nSeriesHash);
 }

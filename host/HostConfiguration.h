@@ -41,10 +41,12 @@ class CHostRobotConfiguration : public CRobotConfigurationBasic {
                                                       TLineNumber line, const CString &sSourceFile,
                                                       CString &sError) override;
   /// Keeps `nHostData` a fingerprint of the data-log series, so that the
-  /// record's comparison sees a difference in them.
+  /// record's comparison sees a difference in them; call after each change
+  /// (an append, or emptying the series).
   void updateHostDataFingerprint();
 
   CString m_sPathName;
   bool m_bModified = false;
   std::vector<std::vector<CString>> m_datalogSeries;
+  uint32_t m_nSeriesHash = 2166136261u;  ///< running fingerprint of the series
 };

@@ -155,6 +155,12 @@ TEST_F(ConfigurationText, CpuParametersAndAnalogLines) {
   }
   EXPECT_FALSE(parseLine(rec, L"#pragma config(Analog)", sError));
   EXPECT_EQ(sError, L"Bad device index ''");
+  // Only the first 16 sensor ports are analog devices.
+  selectHostPlatform(platformVexI2c);
+  rec.clearConfigurationDefinition();
+  EXPECT_TRUE(parseLine(rec, L"#pragma config(Analog, dgtl8)", sError));
+  EXPECT_FALSE(parseLine(rec, L"#pragma config(Analog, dgtl9)", sError));
+  EXPECT_EQ(sError, L"Bad device index 'dgtl9'");
 }
 
 TEST_F(ConfigurationText, ClearedRecordWritesNothing) {

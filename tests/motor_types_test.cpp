@@ -219,6 +219,7 @@ TEST_F(MotorRules, HubMotorAndServoNumbering) {
   EXPECT_EQ(rec.getDeviceIndexOnMotorHub(hubHTMotor, 0, 1, 1), 6);
   EXPECT_EQ(rec.getDeviceIndexOnMotorHub(hubHTServo, 0, 1, 1), -1);
   EXPECT_EQ(rec.getMotorMuxForMotor(6), hubHTMotor);
+  EXPECT_EQ(rec.getMotorMuxForMotor(7), hubNone);
   EXPECT_EQ(rec.getMotorMuxForMotor(2), hubNone);
 
   // A chain that starts empty holds no motors, though the port holds a controller.
@@ -260,6 +261,7 @@ TEST_F(MotorRules, MotorIOPinsClaimSensorPorts) {
   EXPECT_EQ(rec.getMapMotorToPrimaryIOPin(2), 5);
   EXPECT_EQ(rec.getMapMotorToSecondaryIOPin(2), 4);
 
+  rec.setSensorModeInConfig(5, 1);
   const TConfigurationSettings before = rec.getSettings();
   rec.setMotorIOPinsInConfig(2, 5, 4, false);
   EXPECT_EQ(std::memcmp(&before, &rec.getSettings(), sizeof before), 0);
