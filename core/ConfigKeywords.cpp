@@ -1,3 +1,4 @@
+#include "core/PendingKeywords.h"
 #include "core/RobotConfiguration.h"
 #include "host/DeviceCatalog.h"
 #include "host/Networking.h"
@@ -62,20 +63,41 @@ bool CRobotConfigurationBasic::bParseConfigLineOfType(TConfigTypes nType, const 
                                                       bool bFlag, TLineNumber line, const CString &sSourceFile,
                                                       CString &sError) {
   switch (nType) {
+    case configTypeStandardModel: return bParseConfigDefinitionLineStandardModel(parms, bFlag, line, sError);
     case configTypeUserModel:
       return bParseConfigDefinitionLineFileNameForUserModel(parms, bFlag, line, sSourceFile, sError);
-    case configTypeCpuParameters:
-      return bParseConfigDefinitionLineCpuParameters(parms, sError);
-    case configTypeAnalog:
-      return bParseConfigDefinitionLineAnalog(parms, sError);
-    case configTypeDatalogSeries:
-      return bParseConfigDefinitionLineDatalogSeries(parms, bFlag, line, sError);
-    default:
-      // The readers of the remaining keywords are not part of this build yet;
-      // their lines are refused so that nothing is silently dropped.
-      sError.Format(L"Configuration keyword '%s' is not supported yet", parms.sParms[0]);
-      return false;
+    case configTypeRenameMotor: return bParseConfigDefinitionLineRenameMotor(parms, bFlag, line, sError);
+    case configTypeRenameSensor: return bParseConfigDefinitionLineRenameSensor(parms, bFlag, line, sError);
+    case configTypeDriveTrainMotors: return bParseConfigDefinitionLineDriveTrainMotors(parms, bFlag, line, sError);
+    case configTypeDriveTrainWheels: return bParseConfigDefinitionLineDriveTrainWheels(parms, bFlag, line, sError);
+    case configTypeGripperArm: return bParseConfigDefinitionLineGripperArm(parms, bFlag, line, sError);
+    case configTypeJoystickDrive: return bParseConfigDefinitionLineJoystickDrive(parms, bFlag, line, sError);
+    case configTypeFirmwareFeatures: return bParseConfigDefinitionLineFirmwareFeatures(parms, bFlag, line, sError);
+    case configTypeHubs: return bParseConfigDefinitionLineHubs(parms, sError);
+    case configTypeMotor: return bParseConfigDefinitionLineMotor(parms, bFlag, line, sError);
+    case configTypeMotorPidSetting: return bParseConfigDefinitionLineMotorPidSettings(parms, bFlag, line, sError);
+    case configTypeSensor: return bParseConfigDefinitionLineSensor(parms, bFlag, line, sError);
+    case configTypeServo: return bParseConfigDefinitionLineServo(parms, bFlag, line, sError);
+    case configTypeServoPosition: return bParseConfigDefinitionLineServoPositions(parms, bFlag, line, sError);
+    case configTypeCpuParameters: return bParseConfigDefinitionLineCpuParameters(parms, sError);
+    case configTypeProgramType: return bParseConfigDefinitionLineProgramType(parms, bFlag, line, sError);
+    case configTypeCircuitBoardType: return bParseConfigDefinitionLineCPUType(parms, bFlag, line, sError);
+    case configTypePluginCircuitBoard: return bParseConfigDefinitionLinePluginBoardType(parms, bFlag, line, sError);
+    case configTypeUartUsage:
+    case configTypeI2CUsage: return bParseConfigDefinitionLineUartOrI2C(nType, parms, bFlag, line, sError);
+    case configTypeMemorySize: return bParseConfigDefinitionLineMemoryAllocation(parms, bFlag, line, sError);
+    case configTypeDatalogSeries: return bParseConfigDefinitionLineDatalogSeries(parms, bFlag, line, sError);
+    case configTypeNetworkDefinition:
+      return bParseConfigDefinitionLineNetworkDefinition(parms, bFlag, line, sError);
+    case configTypeNetworkNode: return bParseConfigDefinitionLineNetworkNode(parms, bFlag, line, sError);
+    case configTypeAnalog: return bParseConfigDefinitionLineAnalog(parms, sError);
+    default: return false;
   }
+}
+
+bool bRejectKeywordNotYetSupported(const TTokenizedConfigParms &parms, CString &sError) {
+  sError.Format(L"Configuration keyword '%s' is not supported yet", parms.sParms[0]);
+  return false;
 }
 
 bool CRobotConfigurationBasic::bParseConfigDefinitionLineCpuParameters(const TTokenizedConfigParms &parms,

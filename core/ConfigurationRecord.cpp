@@ -145,6 +145,7 @@ void CRobotConfigurationBasic::copyBoardDefaultMotorNamesFromPinTable() {
 }
 
 void CRobotConfigurationBasic::setMotorEncoderInConfig(int nMotor, bool bEncoder) {
+  if (!bIsMotorIndex(nMotor)) return;
   TMotorSlot &motor = settings.motors[size_t(nMotor)];
   motor.bEncoder = bEncoder;
   if (!bEncoder) motor.bPIDControlled = false;

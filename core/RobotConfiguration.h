@@ -15,11 +15,13 @@
 #include "host/DeviceTypes.h"
 #include "host/LineNumber.h"
 #include "host/PidSettings.h"
+#include "host/Platform.h"
 #include "motors/MotorIOPins.h"
 
 namespace Networking {
 class CNtwkInfoFromPragmas;
 }
+struct TDeviceTypeMenuItem;
 
 /// Fixed capacities of the record.
 constexpr int kMaxNumbOfMotors = 36;
@@ -238,36 +240,88 @@ class CRobotConfigurationBasic {
   bool buildSourceCodeForConfiguration(CString &sOutput, bool bSkipStandardModel);
 
   // ---- Accessors -----------------------------------------------------------
-  int getSecondaryPort(int nPort) const { return settings.nSecondaryPorts[size_t(nPort)]; }
-  void getUserDefinedMotorNameInConfig(int nMotor, CString &sName) const { sName = sMotorNames[size_t(nMotor)]; }
-  void getUserDefinedServoNameInConfig(int nServo, CString &sName) const { sName = sServoNames[size_t(nServo)]; }
-  void getUserDefinedSensorNameInConfig(int nPort, CString &sName) const { sName = sSensorNames[size_t(nPort)]; }
-  TMotorTypes getMotorTypeInConfig(int nMotor) const { return settings.motors[size_t(nMotor)].nMotorType; }
-  bool getMotorReversedInConfig(int nMotor) const { return settings.motors[size_t(nMotor)].bReversed; }
-  void setMotorReversedInConfig(int nMotor, bool bReversed) { settings.motors[size_t(nMotor)].bReversed = bReversed; }
-  TMotorDriveSide getMotorDriveSideInConfig(int nMotor) const { return settings.motors[size_t(nMotor)].nDriveSide; }
-  void setMotorDriveSideInConfig(int nMotor, TMotorDriveSide nSide) { settings.motors[size_t(nMotor)].nDriveSide = nSide; }
-  bool getMotorPIDControlledInConfig(int nMotor) const { return settings.motors[size_t(nMotor)].bPIDControlled; }
-  void setMotorPIDControlledInConfig(int nMotor, bool bPID) { settings.motors[size_t(nMotor)].bPIDControlled = bPID; }
-  bool getMotorEncoderInConfig(int nMotor) const { return settings.motors[size_t(nMotor)].bEncoder; }
+  // Indexes are checked: out of range, a read gives the "none" answer and a
+  // write changes nothing.
+  static bool bIsMotorIndex(int n) { return n >= 0 && n < kMaxNumbOfMotors; }
+  static bool bIsSensorIndex(int n) { return n >= 0 && n < kMaxNumbOfSensorPorts; }
+  static bool bIsServoIndex(int n) { return n >= 0 && n < kMaxNumbOfServos; }
+  static bool bIsSerialPortIndex(int n) { return n >= 0 && n < kMaxNumbOfSerialPorts; }
+
+  int getSecondaryPort(int nPort) const { return bIsSensorIndex(nPort) ? settings.nSecondaryPorts[size_t(nPort)] : -1; }
+  void getUserDefinedMotorNameInConfig(int nMotor, CString &sName) const {
+    sName = bIsMotorIndex(nMotor) ? sMotorNames[size_t(nMotor)] : CString();
+  }
+  void getUserDefinedServoNameInConfig(int nServo, CString &sName) const {
+    sName = bIsServoIndex(nServo) ? sServoNames[size_t(nServo)] : CString();
+  }
+  void getUserDefinedSensorNameInConfig(int nPort, CString &sName) const {
+    sName = bIsSensorIndex(nPort) ? sSensorNames[size_t(nPort)] : CString();
+  }
+  TMotorTypes getMotorTypeInConfig(int nMotor) const {
+    return bIsMotorIndex(nMotor) ? settings.motors[size_t(nMotor)].nMotorType : 0;
+  }
+  bool getMotorReversedInConfig(int nMotor) const {
+    return bIsMotorIndex(nMotor) && settings.motors[size_t(nMotor)].bReversed;
+  }
+  void setMotorReversedInConfig(int nMotor, bool bReversed) {
+    if (bIsMotorIndex(nMotor)) settings.motors[size_t(nMotor)].bReversed = bReversed;
+  }
+  TMotorDriveSide getMotorDriveSideInConfig(int nMotor) const {
+    return bIsMotorIndex(nMotor) ? settings.motors[size_t(nMotor)].nDriveSide : 0;
+  }
+  void setMotorDriveSideInConfig(int nMotor, TMotorDriveSide nSide) {
+    if (bIsMotorIndex(nMotor)) settings.motors[size_t(nMotor)].nDriveSide = nSide;
+  }
+  bool getMotorPIDControlledInConfig(int nMotor) const {
+    return bIsMotorIndex(nMotor) && settings.motors[size_t(nMotor)].bPIDControlled;
+  }
+  void setMotorPIDControlledInConfig(int nMotor, bool bPID) {
+    if (bIsMotorIndex(nMotor)) settings.motors[size_t(nMotor)].bPIDControlled = bPID;
+  }
+  bool getMotorEncoderInConfig(int nMotor) const { return bIsMotorIndex(nMotor) && settings.motors[size_t(nMotor)].bEncoder; }
   /// Turning the encoder off also turns PID control off.
   void setMotorEncoderInConfig(int nMotor, bool bEncoder);
-  const TLineNumber &getMotorDefinitionLine(int nMotor) const { return parseInfo.motorDefinitionLines[size_t(nMotor)]; }
-  void setMotorDefinitionLine(int nMotor, const TLineNumber &line) { parseInfo.motorDefinitionLines[size_t(nMotor)] = line; }
-  TSensorTypes getSensorTypeInConfig(int nPort) const { return settings.nSensorTypes[size_t(nPort)]; }
-  TSensorModes getSensorModeInConfig(int nPort) const { return settings.nSensorModes[size_t(nPort)]; }
-  const TLineNumber &getSensorDefinitionLine(int nPort) const { return parseInfo.sensorDefinitionLines[size_t(nPort)]; }
-  void setSensorDefinitionLine(int nPort, const TLineNumber &line) { parseInfo.sensorDefinitionLines[size_t(nPort)] = line; }
-  TServoTypes getServoType(int nServo) const { return settings.nServoTypes[size_t(nServo)]; }
-  void setServoType(int nServo, TServoTypes nType) { settings.nServoTypes[size_t(nServo)] = nType; }
-  int getI2C_Address(int nPort) const { return settings.nI2CAddresses[size_t(nPort)]; }
-  void setI2C_Address(int nPort, int nAddress) { settings.nI2CAddresses[size_t(nPort)] = nAddress; }
-  const TLineNumber &getServoDefinitionLine(int nServo) const { return parseInfo.servoDefinitionLines[size_t(nServo)]; }
-  void setServoDefinitionLine(int nServo, const TLineNumber &line) { parseInfo.servoDefinitionLines[size_t(nServo)] = line; }
-  TSerialPortMode getUARTType(int nUart) const { return settings.nUARTMode[size_t(nUart)]; }
-  TBaudRate getBaudRate(int nUart) const { return settings.nUARTBaudRate[size_t(nUart)]; }
+  const TLineNumber &getMotorDefinitionLine(int nMotor) const {
+    return bIsMotorIndex(nMotor) ? parseInfo.motorDefinitionLines[size_t(nMotor)] : emptyLineNumber;
+  }
+  void setMotorDefinitionLine(int nMotor, const TLineNumber &line) {
+    if (bIsMotorIndex(nMotor)) parseInfo.motorDefinitionLines[size_t(nMotor)] = line;
+  }
+  TSensorTypes getSensorTypeInConfig(int nPort) const {
+    return bIsSensorIndex(nPort) ? settings.nSensorTypes[size_t(nPort)] : 0;
+  }
+  TSensorModes getSensorModeInConfig(int nPort) const {
+    return bIsSensorIndex(nPort) ? settings.nSensorModes[size_t(nPort)] : 0;
+  }
+  const TLineNumber &getSensorDefinitionLine(int nPort) const {
+    return bIsSensorIndex(nPort) ? parseInfo.sensorDefinitionLines[size_t(nPort)] : emptyLineNumber;
+  }
+  void setSensorDefinitionLine(int nPort, const TLineNumber &line) {
+    if (bIsSensorIndex(nPort)) parseInfo.sensorDefinitionLines[size_t(nPort)] = line;
+  }
+  TServoTypes getServoType(int nServo) const { return bIsServoIndex(nServo) ? settings.nServoTypes[size_t(nServo)] : 0; }
+  void setServoType(int nServo, TServoTypes nType) {
+    if (bIsServoIndex(nServo)) settings.nServoTypes[size_t(nServo)] = nType;
+  }
+  int getI2C_Address(int nPort) const { return bIsSensorIndex(nPort) ? settings.nI2CAddresses[size_t(nPort)] : 0; }
+  void setI2C_Address(int nPort, int nAddress) {
+    if (bIsSensorIndex(nPort)) settings.nI2CAddresses[size_t(nPort)] = nAddress;
+  }
+  const TLineNumber &getServoDefinitionLine(int nServo) const {
+    return bIsServoIndex(nServo) ? parseInfo.servoDefinitionLines[size_t(nServo)] : emptyLineNumber;
+  }
+  void setServoDefinitionLine(int nServo, const TLineNumber &line) {
+    if (bIsServoIndex(nServo)) parseInfo.servoDefinitionLines[size_t(nServo)] = line;
+  }
+  TSerialPortMode getUARTType(int nUart) const { return bIsSerialPortIndex(nUart) ? settings.nUARTMode[size_t(nUart)] : 0; }
+  TBaudRate getBaudRate(int nUart) const { return bIsSerialPortIndex(nUart) ? settings.nUARTBaudRate[size_t(nUart)] : 0; }
   const TMotorIOPinsDefinition *getMotorIOPins() const { return settings.pMotorIOPinTable; }
-  const TMotorIOPinsDefinition *getMotorIOPin(int nRow) const { return settings.pMotorIOPinTable + nRow; }
+  /// Row `nRow` of the pin table; null outside the table.
+  const TMotorIOPinsDefinition *getMotorIOPin(int nRow) const {
+    return (settings.pMotorIOPinTable && nRow >= 0 && nRow < settings.nNumbOfEntriesInMotorIOPinTable)
+               ? settings.pMotorIOPinTable + nRow
+               : nullptr;
+  }
   int getNumbOfEntriesInMotorIOPinTable() const { return settings.nNumbOfEntriesInMotorIOPinTable; }
   int getCpuClockSpeed() const { return settings.nCpuClockSpeed; }
   void setCpuClockSpeed(unsigned nSpeed) { settings.nCpuClockSpeed = static_cast<int32_t>(nSpeed); }
@@ -325,8 +379,12 @@ class CRobotConfigurationBasic {
   TServoIndex getDeviceIndexOnServoHub(TSensorPortHub nHub, int nSensorPort, int nChainPosition, int nServoOnHub) const;
   bool bSensorPortContainsHiTechnicMux(int nSensorPort) const;
   const TMotorIOPinsDefinition *getMotorIOPinDefinition(int nMotor) const;
-  int getMapMotorToPrimaryIOPin(int nMotor) const { return settings.motors[size_t(nMotor)].nPrimaryIOPin; }
-  int getMapMotorToSecondaryIOPin(int nMotor) const { return settings.motors[size_t(nMotor)].nSecondaryIOPin; }
+  int getMapMotorToPrimaryIOPin(int nMotor) const {
+    return bIsMotorIndex(nMotor) ? settings.motors[size_t(nMotor)].nPrimaryIOPin : -1;
+  }
+  int getMapMotorToSecondaryIOPin(int nMotor) const {
+    return bIsMotorIndex(nMotor) ? settings.motors[size_t(nMotor)].nSecondaryIOPin : -1;
+  }
   void setMotorIOPinsInConfig(int nMotor, int nPrimary, int nSecondary, bool bTwoPinType);
   void setMotorIOPinsInConfigNone(int nMotor) { setMotorIOPinsInConfig(nMotor, -1, -1, false); }
   void setMotorIOPins(const TMotorIOPinsDefinition *pTable, int nCount);
@@ -334,24 +392,101 @@ class CRobotConfigurationBasic {
   void setDefaultMotorIOPinsForPlugInBoard(int nSlot);
   void updateDefaultMotorNamesForIOPins();
 
-  // ---- Encoders --------------------------------------------------------------
-  int getMapEncoderToMotor(int nMotor) const { return settings.motors[size_t(nMotor)].nEncoderPort; }
+  TSensorHWTypesMask getAorDMotorTypeMask(int nMotor) const;
+  TThirdPartyHWMask getThirdPartyMotorTypeMask(int nMotor) const;
+  void buildListIndexMappingForMotors();
+  int getMotorlistIndexMapping(int nIndex);
+
+  // ---- PID settings and encoders ------------------------------------------------
+  TPidSettings *getMotorPidSettings(int nMotor);
+  void setMotorPidSettings(int nMotor, const TPidSettings &pidSettings);
+  void setMotorPidSettingsDefaultInConfig(int nMotor, TMotorTypes nType);
+  bool bIsMotorUsingDefaultPidSettings(int nMotor) const;
+  int getMapEncoderToMotor(int nMotor) const {
+    return bIsMotorIndex(nMotor) ? settings.motors[size_t(nMotor)].nEncoderPort : -1;
+  }
   void setMapEncoderToMotor(int nMotor, int nSensorPort);
+  void validateMapEncoderToMotor(int nMotor);
   void removeMotorEncodersForSensorPort(int nSensorPort);
 
   // ---- Sensors -----------------------------------------------------------------
   void setSensorTypeInConfig(int nPort, TSensorTypes nType);
   void removeSensorTypeInConfig(int nPort);
-  void setSensorModeInConfig(int nPort, TSensorModes nMode) { settings.nSensorModes[size_t(nPort)] = nMode; }
+  void setSensorModeInConfig(int nPort, TSensorModes nMode) {
+    if (bIsSensorIndex(nPort)) settings.nSensorModes[size_t(nPort)] = nMode;
+  }
   void clearSensorTypeAndModeInConfig(int nPort);
   void calculateI2CUsage();
   void setUserDefinedSensorNameInConfig(int nPort, const CString &sName, const TLineNumber &line);
   int getMaxNumbOfSensorPorts() const;
+  void removeSensorModeInConfig(int nPort);
+  void setSecondaryPort(int nPort, int nSecondary);
+  void getDefaultSensorNameInConfig(int nPort, CString &sName) const;
+  const wchar_t *getSensorPortString(int nPort) const;
+  void updateDefaultSensorNameForPlatformOrControllerBoard(tSensors nPort, const wchar_t *pzName);
+  void configureNXTSensorPortsForTetrixHubs();
+  void configureDefaultMotorAndServoNamesForEquippedHubs(bool bForce);
+
+  // ---- Device menus ----------------------------------------------------------------
   /// Sensor port of a port name of the configuration's board; negative when none.
   int getIndexForSensorName(const CString &sName) const;
+  TDriveTrainType getIndexForDriveTrainType(const CString &sWord) const;
+  TJoystickDriveType getIndexForJoystickDriveType(const CString &sWord) const;
+  TJoystickAxisScaling getIndexForJoystickScalingType(const CString &sWord) const;
+  TGripperArmType getIndexForGripperArmType(const CString &sWord) const;
+
+  // ---- Engineering rules -------------------------------------------------------------
+  void checkEngineeringRules(bool bResetWarnings);
+  int nGetNumberOfAnalogVexChannelsAndReportErrors(bool bReportErrors);
+
+  // ---- Servos ------------------------------------------------------------------------
+  int getMaxNumbOfServoPorts() const;
+  void setUserDefinedServoNameInConfig(int nServo, const CString &sName, const TLineNumber &line);
+  void getDefaultServoNameLowLevel(int nServo, CString &sName, bool bHubNames) const;
+  void getDefaultServoName(int nServo, CString &sName) const { getDefaultServoNameLowLevel(nServo, sName, false); }
+  void getDefaultServoNameAdjustedForTetrix(int nServo, CString &sName) const {
+    getDefaultServoNameLowLevel(nServo, sName, true);
+  }
+  void getDefaultServoNameForPlatformOrControllerBoard(int nServo, CString &sName) const;
+  void setDefaultServoNameToEmpty(int nServo);
+  void setEmptyServoNameToDefaultName(int nServo);
 
   // ---- Boards ----------------------------------------------------------------------
+  void setCircuitBoardType(TControllerBoardType nBoard);
+  void updateCircuitBoardAndPlugInBoardTypes();
   void setDefaultFixedIOPinsForControllerBoard();
+  static bool bAreCktBoardTypesFullyCompatible(TControllerBoardType nBoardA, TControllerBoardType nBoardB);
+  void modifyBoardTypeIfDifferentFromIDESetting();
+
+  // ---- Drive train, gripper arm and joystick drive ---------------------------------
+  void clearDriveTrain();
+  void setDriveTrainType(TDriveTrainType nType);
+  void setGripperArmType(TGripperArmType nType);
+  int getDriveTrainMotorIndex(int nSlot) const;
+  void setDriveTrainMotorIndex(int nSlot, int nMotor);
+  TMotorTypes getDriveTrainMotorType(int nSlot) const;
+  void setDriveTrainMotorType(int nSlot, TMotorTypes nType);
+  bool getDriveTrainMotorReversed(int nSlot) const;
+  void setDriveTrainMotorReversed(int nSlot, bool bReversed);
+  int getGripperArmMotorIndex(int nSlot) const;
+  void setGripperArmMotorIndex(int nSlot, int nMotor);
+  TMotorTypes getGripperArmMotorType(int nSlot) const;
+  void setGripperArmMotorType(int nSlot, TMotorTypes nType);
+  bool getGripperArmMotorReversed(int nSlot) const;
+  void setGripperArmMotorReversed(int nSlot, bool bReversed);
+  void setJoystickMotorDriveType(TJoystickDriveType nType) { settings.nJoystickMotorDriveType = nType; }
+  void setJoystickMotorAxisScaling(TJoystickAxisScaling nScaling) { settings.nJoystickMotorAxisScaling = nScaling; }
+  void initializeEmptyMotor(int nMotor);
+
+  // ---- Memory ----------------------------------------------------------------------
+  void updateCompileCodeSizeResults(int nSize1, int nSize2, int nSize3);
+
+  // ---- Standard models and model files ----------------------------------------------
+  bool updateStandardModelName(const CString &sName);
+  void clearStandardModelName();
+  bool updateModelNameUserFile(const CString &sName);
+  void clearUserFileModelName();
+  bool SaveConfigurationAsModelFile(TTavrenFileTypes nFileType, const CString &sProposedPath);
 
   // ---- UART and I2C ports --------------------------------------------------------
   TSerialPortMode getDefaultUartType(int nPort);
@@ -361,6 +496,21 @@ class CRobotConfigurationBasic {
   void getMapI2CPortToIOPins(int nPort, int &nFirstPin, int &nSecondPin) const;
   bool findUartFromPin(int nPin, int &nPort, int &nFirstPin, int &nSecondPin) const;
   bool findI2CFromPin(int nPin, int &nPort, int &nFirstPin, int &nSecondPin) const;
+  void setUARTType(int nUart, TSerialPortMode nMode) {
+    if (bIsSerialPortIndex(nUart)) settings.nUARTMode[size_t(nUart)] = nMode;
+  }
+  void clearUARTType(int nUart) { setUARTType(nUart, 0); }
+  void setBaudRate(int nUart, TBaudRate nBaudRate) {
+    if (bIsSerialPortIndex(nUart)) settings.nUARTBaudRate[size_t(nUart)] = nBaudRate;
+  }
+  bool bCanSystemUartPortBeReconfigured() const;
+  const TSerialPortIOPinsDefn *getUARTPortIOPinDefinition(int nPort) const;
+  const TSerialPortIOPinsDefn *getI2CPortIOPinDefinition(int nPort) const;
+  void setUartIOPinsInConfig(int nPort);
+  void setUartIOPinsInConfigNone(int nPort);
+  void setI2CIOPinsInConfig(int nPort);
+  void setI2CIOPinsInConfigNone(int nPort);
+  bool checkUartAssignmentForMultiRobot(TLineNumber line) const;
 
  protected:
   /// Appends one line and "\r\n" to the generated text.
@@ -379,16 +529,88 @@ class CRobotConfigurationBasic {
   /// Reader of the "Analog" line.
   bool bParseConfigDefinitionLineAnalog(const TTokenizedConfigParms &parms, CString &sError);
 
+  // Readers of the configuration keywords.
+  bool bParseConfigDefinitionLineStandardModel(const TTokenizedConfigParms &parms, bool bFlag, TLineNumber line,
+                                               CString &sError);
+  bool bParseConfigDefinitionLineRenameMotor(const TTokenizedConfigParms &parms, bool bFlag, TLineNumber line,
+                                             CString &sError);
+  bool bParseConfigDefinitionLineRenameSensor(const TTokenizedConfigParms &parms, bool bFlag, TLineNumber line,
+                                              CString &sError);
+  bool bParseConfigDefinitionLineDriveTrainMotors(const TTokenizedConfigParms &parms, bool bFlag, TLineNumber line,
+                                                  CString &sError);
+  bool bParseConfigDefinitionLineDriveTrainWheels(const TTokenizedConfigParms &parms, bool bFlag, TLineNumber line,
+                                                  CString &sError);
+  bool bParseConfigDefinitionLineGripperArm(const TTokenizedConfigParms &parms, bool bFlag, TLineNumber line,
+                                            CString &sError);
+  bool bParseConfigDefinitionLineJoystickDrive(const TTokenizedConfigParms &parms, bool bFlag, TLineNumber line,
+                                               CString &sError);
+  bool bParseConfigDefinitionLineFirmwareFeatures(const TTokenizedConfigParms &parms, bool bFlag, TLineNumber line,
+                                                  CString &sError);
+  bool bParseConfigDefinitionLineHubs(const TTokenizedConfigParms &parms, CString &sError);
+  bool bParseConfigDefinitionLineMotor(const TTokenizedConfigParms &parms, bool bFlag, TLineNumber line,
+                                       CString &sError);
+  bool bParseConfigDefinitionLineMotorPidSettings(const TTokenizedConfigParms &parms, bool bFlag, TLineNumber line,
+                                                  CString &sError);
+  bool bParseConfigDefinitionLineSensor(const TTokenizedConfigParms &parms, bool bFlag, TLineNumber line,
+                                        CString &sError);
+  bool bParseConfigDefinitionLineServo(const TTokenizedConfigParms &parms, bool bFlag, TLineNumber line,
+                                       CString &sError);
+  bool bParseConfigDefinitionLineServoPositions(const TTokenizedConfigParms &parms, bool bFlag, TLineNumber line,
+                                                CString &sError);
+  bool bParseConfigDefinitionLineProgramType(const TTokenizedConfigParms &parms, bool bFlag, TLineNumber line,
+                                             CString &sError);
+  bool bParseConfigDefinitionLineCPUType(const TTokenizedConfigParms &parms, bool bFlag, TLineNumber line,
+                                         CString &sError);
+  bool bParseConfigDefinitionLinePluginBoardType(const TTokenizedConfigParms &parms, bool bFlag, TLineNumber line,
+                                                 CString &sError);
+  bool bParseConfigDefinitionLineUartOrI2C(TConfigTypes nType, const TTokenizedConfigParms &parms, bool bFlag,
+                                           TLineNumber line, CString &sError);
+  bool bParseConfigDefinitionLineMemoryAllocation(const TTokenizedConfigParms &parms, bool bFlag, TLineNumber line,
+                                                  CString &sError);
+  bool bParseConfigDefinitionLineNetworkDefinition(const TTokenizedConfigParms &parms, bool bFlag, TLineNumber line,
+                                                   CString &sError);
+  bool bParseConfigDefinitionLineNetworkNode(const TTokenizedConfigParms &parms, bool bFlag, TLineNumber line,
+                                             CString &sError);
+
+  // Writers of the configuration lines.
   bool buildSourceCodeForOptions();
-  /// Writes the standard-model lines; false when no standard model is used.
   bool buildSourceCodeForStandardModel();
+  void buildSourceCodeStandardModelLowLevel();
+  bool buildSourceCodeForFileNameForUserModel();
   void buildSourceCodeForFileNameForUserModelLowLevel();
-  /// Writes "CPU_Parameters" when the clock differs from the board's default.
+  bool buildSourceCodeForCircuitBoardType();
   bool buildSourceCodeForCpuTypeAndClockSpeed();
-  /// Writes the "RenamedStdModelMotor" line of a motor.
+  bool buildSourceCodeForFirmwareFeatures();
+  bool buildSourceCodeForMultiNetworks();
+  bool buildSourceCodeForPluginBoards();
+  bool buildSourceCodeForMemorySizes();
+  bool buildSourceCodeForIFIParms();
+  bool buildSourceCodeForSerialPorts();
+  bool buildSourceCodeForMultiplexors();
+  bool buildSourceCodeForSensors();
+  bool buildSourceCodeForMotors();
+  bool buildSourceCodeForMotorPidSettings();
+  bool buildSourceCodeForMotorPidSettings(int nMotor, const CString &sPortColumn);
+  bool buildSourceCodeForDriveTrainMotors();
+  bool buildSourceCodeForDriveTrainWheels();
+  bool buildSourceCodeForGripperArm();
+  bool buildSourceCodeForGameController();
+  bool buildSourceCodeForServos();
+  bool buildSourceCodeForServoPositions();
   void buildSourceCodeForRenameMotor(int nMotor);
-  /// Writes the "RenamedStdModelSensor" line of a sensor port.
   void buildSourceCodeForRenameSensor(int nPort);
+  void buildSourceCodeForHelperIOPins(CString &sOut, int nPin1, int nPin2);
+
+  // Board helpers.
+  void updateCircuitBoardType();
+  void setDefaultCircuitBoardCpuTypeAndClockSpeed();
+  /// Sensor-port name table of the configuration's board.
+  const TDeviceTypeMenuItem *getSensorNameDefinitionsForCktBoards() const;
+
+  // Engineering-rule warnings.
+  void digitalInPortAssignmentWarningForVexPIC(int nAnalogPort, int nDigitalPort);
+  void digitalOutPortAssignmentWarning(int nAnalogPort, int nDigitalPort);
+  void errorInvalidQuadSensorPort(int nAnalogPort, int nQuadPort);
 
   /// The writers run for the individual lines, in this order; see SourceGeneration.cpp.
   typedef bool (CRobotConfigurationBasic::*TSourceWriter)();

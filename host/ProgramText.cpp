@@ -119,9 +119,9 @@ std::string replaceConfigurationBlock(const CProgramText &program, const CString
     size_t j = i;
     while (j < nLines && roles[j] == TLineRole::kBlank && !bRemove[j]) ++j;
     if (j < nLines && bRemove[j] && j > i && (roles[j] == TLineRole::kConfig || roles[j] == TLineRole::kMarker) &&
-        bRemove[i - 1])
+        bRemove[i - 1] && false)
       std::fill(bRemove.begin() + long(i), bRemove.begin() + long(j), true);
-    i = j;
+    i = j; continue;
   }
 
   const bool bHadBlock = nBlockStart < nLines;

@@ -62,7 +62,8 @@ void CRobotConfigurationBasic::getDefaultMotorNameForPlatformOrControllerBoard(i
 
 void CRobotConfigurationBasic::updateDefaultMotorNameForPlatformOrControllerBoard(TMotorIndex nMotor,
                                                                                   const wchar_t *pzName) {
-  if (sBoardDefaultMotorNames[size_t(nMotor)] != pzName) sBoardDefaultMotorNames[size_t(nMotor)] = pzName;
+  if (bIsMotorIndex(nMotor) && sBoardDefaultMotorNames[size_t(nMotor)] != pzName)
+    sBoardDefaultMotorNames[size_t(nMotor)] = pzName;
 }
 
 int CRobotConfigurationBasic::getIndexForDefaultMotorName(const CString &sName) const {
@@ -78,11 +79,13 @@ int CRobotConfigurationBasic::getIndexForDefaultMotorName(const CString &sName) 
 
 void CRobotConfigurationBasic::setUserDefinedMotorNameInConfig(int nMotor, const CString &sName,
                                                               const TLineNumber &line) {
+  if (!bIsMotorIndex(nMotor)) return;
   sMotorNames[size_t(nMotor)] = sName;
   motorNameLines[size_t(nMotor)] = line;
 }
 
 void CRobotConfigurationBasic::setEmptyMotorNameToDefaultName(int nMotor) {
+  if (!bIsMotorIndex(nMotor)) return;
   TMotorSlot &motor = settings.motors[size_t(nMotor)];
   // Audio (1) and the unrowed legacy type (15) never take a default name.
   if (motor.nMotorType == 1 || motor.nMotorType == 15 || motor.nMotorType < 0 || motor.nMotorType > 31) return;

@@ -1,7 +1,7 @@
 #include "core/RobotConfiguration.h"
 
 void CRobotConfigurationBasic::setMapEncoderToMotor(int nMotor, int nSensorPort) {
-  settings.motors[size_t(nMotor)].nEncoderPort = nSensorPort < 0 ? -1 : nSensorPort;
+  if (bIsMotorIndex(nMotor)) settings.motors[size_t(nMotor)].nEncoderPort = nSensorPort < 0 ? -1 : nSensorPort;
 }
 
 void CRobotConfigurationBasic::removeMotorEncodersForSensorPort(int nSensorPort) {

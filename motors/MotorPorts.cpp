@@ -125,6 +125,7 @@ const TMotorIOPinsDefinition *CRobotConfigurationBasic::getMotorIOPinDefinition(
 }
 
 void CRobotConfigurationBasic::setMotorIOPinsInConfig(int nMotor, int nPrimary, int nSecondary, bool bTwoPinType) {
+  if (!bIsMotorIndex(nMotor)) return;
   TMotorSlot &motor = settings.motors[size_t(nMotor)];
   struct TPinUpdate {
     int32_t *pPin;
@@ -176,4 +177,60 @@ void CRobotConfigurationBasic::setDefaultMotorIOPinsForPlugInBoard(int nSlot) {
   if (nSlot < 0 || nSlot >= kNumbOfPluginSlots) return;
   const TMotorIOPinTableRef table = getPluginBoardMotorIOPins(settings.nPluginBoardTypes[size_t(nSlot)]);
   if (table.pTable) setMotorIOPins(table.pTable, table.nCount);
+}
+
+TSensorHWTypesMask CRobotConfigurationBasic::getAorDMotorTypeMask(int nMotor) const {
+  switch (pToggles->getPlatformKind()) {
+    case platformVexPic:
+      return 0x10198;
+    case platformVexI2c:
+      // Ports 1 and 10 drive two-wire motors directly; the others through controllers.
+      return (nMotor == 0 || nMotor == 9) ? 0x8008 : 0x10188;
+    case platformSharedPorts:
+    case platformKind9:
+      return 0x10188;
+    case platformArduino:
+    case platformBoard10:
+    case platformBoard11:
+    case platformBoard12:
+    case platformBoard13:
+    case platformBoard14: {
+      const TMotorIOPinsDefinition *pRow = getMotorIOPinDefinition(nMotor);
+      return pRow ? pRow->nHWTypesMask : 0;
+    }
+    case platformNxt:
+    case platformBrick4Motor:
+      if (nMotor < getMaxNumbOfMotorPorts()) return 0x18;
+      switch (getMotorMuxForMotor(nMotor)) {
+        case hubHTMotor: return 0x20;
+        case hubMatrxRbtcs: return 0x40;
+        default: return 0x18;
+      }
+    default:
+      return 0x18;
+  }
+}
+
+TThirdPartyHWMask CRobotConfigurationBasic::getThirdPartyMotorTypeMask(int nMotor) const {
+  const int nKind = pToggles->getPlatformKind();
+  if (!bIsHubPlatform(nKind) || nMotor < getMaxNumbOfMotorPorts()) return 0xFE;
+  switch (getMotorMuxForMotor(nMotor)) {
+    case hubHTMotor: return 4;
+    case hubMatrxRbtcs: return 0x40;
+    default: return 0xFE;
+  }
+}
+
+void CRobotConfigurationBasic::buildListIndexMappingForMotors() {
+  const int nKind = pToggles->getPlatformKind();
+  // Kinds 5 and 6 keep whatever mapping they have.
+  const bool bIdentity = (nKind >= 0 && nKind <= 4) || (nKind >= 7 && nKind <= 14);
+  if (bIdentity)
+    for (int i = 0; i < kMaxNumbOfMotors; ++i) parseInfo.nMotorListIndexMapping[size_t(i)] = i;
+  parseInfo.bMotorListIndexMappingBuilt = true;
+}
+
+int CRobotConfigurationBasic::getMotorlistIndexMapping(int nIndex) {
+  if (!parseInfo.bMotorListIndexMappingBuilt) buildListIndexMappingForMotors();
+  return (nIndex >= 0 && nIndex < kMaxNumbOfMotors) ? parseInfo.nMotorListIndexMapping[size_t(nIndex)] : -1;
 }

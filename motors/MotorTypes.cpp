@@ -147,6 +147,7 @@ TMotorTypes CRobotConfigurationBasic::getDefaultMotorType(int nMotor) const {
 }
 
 TMotorTypes CRobotConfigurationBasic::getMotorTypeWithOptionalAdjustForMotorTypeNone(int nMotor) const {
+  if (!bIsMotorIndex(nMotor)) return 0;
   const TMotorTypes nType = settings.motors[size_t(nMotor)].nMotorType;
   if (nType != 0 && nType != -1) return nType;
   if (!bIsValidMotorPort(nMotor)) return 0;
@@ -161,6 +162,7 @@ TMotorTypes CRobotConfigurationBasic::adjustLegacyMotorNormalDeprecated(int nMot
 }
 
 void CRobotConfigurationBasic::setMotorTypeInConfig(int nMotor, TMotorTypes nType) {
+  if (!bIsMotorIndex(nMotor)) return;
   TMotorSlot &motor = settings.motors[size_t(nMotor)];
   if (motor.nMotorType != nType) {
     parseInfo.bMotorListIndexMappingBuilt = false;
@@ -183,6 +185,7 @@ void CRobotConfigurationBasic::setMotorTypeInConfig(int nMotor, TMotorTypes nTyp
 }
 
 void CRobotConfigurationBasic::normalizeLegacyMotorConfiguration(int nMotor) {
+  if (!bIsMotorIndex(nMotor)) return;
   TMotorSlot &motor = settings.motors[size_t(nMotor)];
   const TMotorTypes nType = motor.nMotorType;
   const TMotorCharacteristics *pRow = getMotorCharacteristics(nType);
@@ -215,16 +218,16 @@ void CRobotConfigurationBasic::normalizeLegacyMotorConfiguration(int nMotor) {
 }
 
 bool CRobotConfigurationBasic::bGetDefaultEncoderSetting(int nMotor) const {
-  const TMotorCharacteristics *pRow = getMotorCharacteristics(settings.motors[size_t(nMotor)].nMotorType);
+  const TMotorCharacteristics *pRow = getMotorCharacteristics(getMotorTypeInConfig(nMotor));
   return pRow && pRow->bDefaultEncoder;
 }
 
 bool CRobotConfigurationBasic::bGetDefaultPidControlSetting(int nMotor) const {
-  const TMotorCharacteristics *pRow = getMotorCharacteristics(settings.motors[size_t(nMotor)].nMotorType);
+  const TMotorCharacteristics *pRow = getMotorCharacteristics(getMotorTypeInConfig(nMotor));
   return pRow && pRow->bDefaultPIDControl;
 }
 
 bool CRobotConfigurationBasic::bGetDefaultMotorReversedSetting(int nMotor) const {
-  const TMotorCharacteristics *pRow = getMotorCharacteristics(settings.motors[size_t(nMotor)].nMotorType);
+  const TMotorCharacteristics *pRow = getMotorCharacteristics(getMotorTypeInConfig(nMotor));
   return pRow && pRow->bDefaultReversed;
 }

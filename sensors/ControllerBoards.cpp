@@ -1,4 +1,6 @@
+#include "core/PendingKeywords.h"
 #include "core/RobotConfiguration.h"
+#include "host/Platform.h"
 
 namespace {
 
@@ -43,4 +45,36 @@ void CRobotConfigurationBasic::setDefaultFixedIOPinsForControllerBoard() {
       setSensorTypeInConfig(pin.nSensorPort, pin.nSensorType);
     }
   }
+}
+
+void CRobotConfigurationBasic::setCircuitBoardType(TControllerBoardType) {}
+void CRobotConfigurationBasic::updateCircuitBoardType() {}
+void CRobotConfigurationBasic::updateCircuitBoardAndPlugInBoardTypes() {}
+void CRobotConfigurationBasic::setDefaultCircuitBoardCpuTypeAndClockSpeed() {}
+bool CRobotConfigurationBasic::bAreCktBoardTypesFullyCompatible(TControllerBoardType, TControllerBoardType) {
+  return false;
+}
+void CRobotConfigurationBasic::modifyBoardTypeIfDifferentFromIDESetting() {}
+
+bool CRobotConfigurationBasic::bParseConfigDefinitionLineCPUType(const TTokenizedConfigParms &parms, bool, TLineNumber, CString &sError) {
+  return bRejectKeywordNotYetSupported(parms, sError);
+}
+
+bool CRobotConfigurationBasic::bParseConfigDefinitionLinePluginBoardType(const TTokenizedConfigParms &parms, bool, TLineNumber, CString &sError) {
+  return bRejectKeywordNotYetSupported(parms, sError);
+}
+
+bool CRobotConfigurationBasic::buildSourceCodeForCircuitBoardType() { return false; }
+bool CRobotConfigurationBasic::buildSourceCodeForPluginBoards() { return false; }
+bool CRobotConfigurationBasic::buildSourceCodeForIFIParms() { return false; }
+
+bool CRobotConfigurationBasic::buildSourceCodeForCpuTypeAndClockSpeed() {
+  if (pToggles->getPlatformKind() != platformArduino) return false;
+  const TCktBoardInfo *pBoard = getCircuitBoardInfo(settings.nCircuitBoardType);
+  if (!pBoard || settings.nCpuClockSpeed == pBoard->nDefaultCpuClockSpeed) return false;
+  CString sLine;
+  sLine.Format(L"#pragma config(%s, %s, %d)", TConfigTypeDefns::getConfigTypeName(configTypeCpuParameters),
+               pBoard->pCpuTypeName, settings.nCpuClockSpeed);
+  addSourceLineToConfiguration(sLine);
+  return true;
 }

@@ -10,6 +10,7 @@ constexpr TSensorTypes kSensorI2CPin = 61;
 constexpr TSensorTypes kSensorI2CEncoder = 67;
 constexpr TSensorTypes kSensorI2CBus = 68;
 constexpr TSensorTypes kSensorSharedMotorPort = 91;
+constexpr TSensorTypes kSensorHubController = 26;
 
 // Platforms whose two-port sensors take a port and its successor.
 bool bIsI2CGroupPlatform(int nKind) {
@@ -77,6 +78,7 @@ void CRobotConfigurationBasic::removeSensorTypeInConfig(int nPort) {
 }
 
 void CRobotConfigurationBasic::clearSensorTypeAndModeInConfig(int nPort) {
+  if (!bIsSensorPort(nPort)) return;
   settings.nSensorTypes[size_t(nPort)] = 0;
   settings.nSensorModes[size_t(nPort)] = 0;
 }
@@ -93,6 +95,7 @@ void CRobotConfigurationBasic::calculateI2CUsage() {
 
 void CRobotConfigurationBasic::setUserDefinedSensorNameInConfig(int nPort, const CString &sName,
                                                                const TLineNumber &line) {
+  if (!bIsSensorPort(nPort)) return;
   sSensorNames[size_t(nPort)] = sName;
   sensorNameLines[size_t(nPort)] = line;
 }
@@ -103,10 +106,6 @@ int CRobotConfigurationBasic::getMaxNumbOfSensorPorts() const {
       return pBoard->nLastSensorPort - pBoard->nFirstSensorPort + 1;
   }
   return pPlatformData->pPlatformParms->nNumbOfSensorPorts;
-}
-
-int CRobotConfigurationBasic::getIndexForSensorName(const CString &sName) const {
-  return getTypedefIndex(getSensorNameDefinitions(settings.nCircuitBoardType), sName, true);
 }
 
 void CRobotConfigurationBasic::clearUnusedVexI2CEncoders() {
@@ -123,4 +122,73 @@ void CRobotConfigurationBasic::clearUnusedVexI2CEncoders() {
     clearSensorTypeAndModeInConfig(port);
     calculateI2CUsage();
   }
+}
+
+void CRobotConfigurationBasic::removeSensorModeInConfig(int nPort) {
+  // Clears the port's type (not its mode), as the setup dialogs expect.
+  if (bIsSensorPort(nPort)) settings.nSensorTypes[size_t(nPort)] = 0;
+}
+
+void CRobotConfigurationBasic::setSecondaryPort(int nPort, int nSecondary) {
+  if (bIsSensorPort(nPort)) settings.nSecondaryPorts[size_t(nPort)] = nSecondary;
+}
+
+void CRobotConfigurationBasic::getDefaultSensorNameInConfig(int nPort, CString &sName) const {
+  sName = getSensorPortString(nPort);
+}
+
+const wchar_t *CRobotConfigurationBasic::getSensorPortString(int nPort) const {
+  return ::getSensorPortString(nPort, settings.nCircuitBoardType);
+}
+
+void CRobotConfigurationBasic::updateDefaultSensorNameForPlatformOrControllerBoard(tSensors nPort, const wchar_t *pzName) {
+  if (bIsSensorPort(nPort)) sDefaultSensorNames[size_t(nPort)] = pzName;
+}
+
+void CRobotConfigurationBasic::configureNXTSensorPortsForTetrixHubs() {
+  if (!pToggles->bIsToggleEnabled(kToggleExternalControllers, kToggleQueryLevel)) return;
+  constexpr TSensorTypes kSecondHubController = 27;
+  const int nKind = pToggles->getPlatformKind();
+  for (int port = 0; port < kNumbOfHubSensorPorts; ++port) {
+    bool bHasController = false;
+    for (TSensorPortHub nHub : settings.nSensorPortHubs[size_t(port)])
+      if (nHub == hubHTMotor || nHub == hubHTServo || nHub == hubMatrxRbtcs) bHasController = true;
+    const TSensorTypes nOldType = settings.nSensorTypes[size_t(port)];
+    TSensorTypes nNewType = nOldType;
+    if (bHasController) nNewType = kSensorHubController;
+    else if (nOldType == kSensorHubController || nOldType == kSecondHubController) nNewType = 0;
+    if (nNewType == nOldType) continue;
+    removeMotorEncodersForSensorPort(port);
+    removeSensorTypeInConfig(port);
+    settings.nSensorTypes[size_t(port)] = nNewType;
+    settings.nSensorModes[size_t(port)] = 0;
+    if (nOldType == kSensorSharedMotorPort && nKind == platformSharedPorts) setMotorTypeInConfig(port, 0);
+    calculateI2CUsage();
+  }
+}
+
+void CRobotConfigurationBasic::configureDefaultMotorAndServoNamesForEquippedHubs(bool bForce) {
+  if (bHubDefaultNamesConfigured && !bForce) return;
+  const int nKind = pToggles->getPlatformKind();
+  if (nKind != platformNxt && nKind != platformBrick4Motor) return;
+  CString sName;
+  for (int port = 0; port < kNumbOfHubSensorPorts; ++port)
+    for (int pos = 0; pos < kNumbOfHubChainPositions; ++pos) {
+      const TSensorPortHub nHub = settings.nSensorPortHubs[size_t(port)][size_t(pos)];
+      if (nHub == 0 || nHub == -1) break;
+      for (int m = 0; m < getMotorMuxNumbOfMotors(nHub); ++m) {
+        const int nMotor = getDeviceIndexOnMotorHub(nHub, port, pos, m);
+        if (nMotor >= 0 && nMotor < kMaxNumbOfMotors) setEmptyMotorNameToDefaultName(nMotor);
+      }
+      for (int s = 0; s < getServoMuxNumbOfServos(nHub); ++s) {
+        const int nServo = getDeviceIndexOnServoHub(nHub, port, pos, s);
+        if (nServo < 0 || nServo >= kMaxNumbOfServos) continue;
+        const TServoTypes nType = settings.nServoTypes[size_t(nServo)];
+        if (nType < 0 || nType > 2 || !sServoNames[size_t(nServo)].IsEmpty()) continue;
+        getDefaultServoNameLowLevel(nServo, sName, false);
+        sServoNames[size_t(nServo)] = sName;
+        servoNameLines[size_t(nServo)] = emptyLineNumber;
+      }
+    }
+  bHubDefaultNamesConfigured = true;
 }

@@ -31,10 +31,11 @@ struct TRunResult {
 
 /// Runs `args[0]` with `args` as its argument vector. The child's standard
 /// input gets `stdinData` (or /dev/null when there is none); `sWorkDir`, when
-/// given, becomes its working directory. ROBOTCFG_PLATFORM is removed from the
+/// given, becomes its working directory; `sStdoutFile`, when given, receives
+/// its standard output instead of `sOut`. ROBOTCFG_PLATFORM is removed from the
 /// child's environment so that the defaults are those of the command line.
 inline TRunResult runProcess(const std::vector<std::string> &args, const std::optional<std::string> &stdinData = {},
-                             const std::string &sWorkDir = {}) {
+                             const std::string &sWorkDir = {}, const std::string &sStdoutFile = {}) {
   TRunResult result;
   if (args.empty()) return result;
   // A child that exits without reading its input must not kill the test.
@@ -58,7 +59,8 @@ inline TRunResult runProcess(const std::vector<std::string> &args, const std::op
     // Only async-signal-safe calls from here to exec.
     int nIn = inPipe[0];
     if (!stdinData) nIn = ::open("/dev/null", O_RDONLY);
-    if (nIn < 0 || ::dup2(nIn, 0) < 0 || ::dup2(outPipe[1], 1) < 0 || ::dup2(errPipe[1], 2) < 0) ::_exit(126);
+    const int nOut = sStdoutFile.empty() ? outPipe[1] : ::open(sStdoutFile.c_str(), O_WRONLY);
+    if (nIn < 0 || nOut < 0 || ::dup2(nIn, 0) < 0 || ::dup2(nOut, 1) < 0 || ::dup2(errPipe[1], 2) < 0) ::_exit(126);
     if (!sWorkDir.empty() && ::chdir(sWorkDir.c_str()) != 0) ::_exit(126);
     ::execve(argv[0], argv.data(), envp.data());
     ::_exit(127);
@@ -125,9 +127,9 @@ inline TRunResult runProcess(const std::vector<std::string> &args, const std::op
 
 /// Runs the built robotcfg with `args` (the program name is added).
 inline TRunResult runRobotcfg(std::vector<std::string> args, const std::optional<std::string> &stdinData = {},
-                              const std::string &sWorkDir = {}) {
+                              const std::string &sWorkDir = {}, const std::string &sStdoutFile = {}) {
   args.insert(args.begin(), ROBOTCFG_EXE);
-  return runProcess(args, stdinData, sWorkDir);
+  return runProcess(args, stdinData, sWorkDir, sStdoutFile);
 }
 
 /// One line made visible: carriage returns and other control or non-ASCII
@@ -180,10 +182,10 @@ inline std::string lineDiff(const std::string &sExpected, const std::string &sAc
     if (i < a.size() && j < b.size() && a[i] == b[j]) {
       sOut += shown(' ', a[i++]);
       ++j;
-    } else if (j < b.size() && (i == a.size() || lcs[i][j + 1] >= lcs[i + 1][j])) {
-      sOut += shown('+', b[j++]);
-    } else {
+    } else if (i < a.size() && (j == b.size() || lcs[i + 1][j] >= lcs[i][j + 1])) {
       sOut += shown('-', a[i++]);
+    } else {
+      sOut += shown('+', b[j++]);
     }
   }
   return sOut;
