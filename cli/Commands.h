@@ -12,7 +12,14 @@ int runCheck(const TOptions &options);
 int runFormat(const TOptions &options);
 int runGenerate(const TOptions &options);
 int runShow(const TOptions &options);
+int runDiff(const TOptions &options);
+int runModels(const TOptions &options);
+int runSaveModel(const TOptions &options);
 
 class CRobotConfigurationBasic;
 /// Prints the configuration as port tables.
 void printConfiguration(CRobotConfigurationBasic &config, std::string &sOut);
+/// Board, fixed pins and plug-in boards, for show.
+void printBoardDetails(CRobotConfigurationBasic &config, std::string &sOut);
+/// Drive train, firmware features, program type and memory, for show.
+void printDriveAndProgramDetails(CRobotConfigurationBasic &config, std::string &sOut);

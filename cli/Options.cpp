@@ -19,6 +19,9 @@ constexpr TCommandName kCommands[] = {
     {"format", TCommand::kFormat},
     {"generate", TCommand::kGenerate},
     {"show", TCommand::kShow},
+    {"diff", TCommand::kDiff},
+    {"models", TCommand::kModels},
+    {"save-model", TCommand::kSaveModel},
 };
 
 // A non-negative decimal number, or -1.
@@ -45,6 +48,10 @@ const char *usageText() {
          "  format FILE...     print each program with its configuration block regenerated\n"
          "  generate FILE      print only the regenerated configuration block\n"
          "  show [FILE]        print the configuration (of FILE, or the empty one) as port tables\n"
+         "  diff A B           compare the configurations of two programs (-v: which devices differ)\n"
+         "  models             list the standard robot models of the platform\n"
+         "  save-model FILE -o OUT\n"
+         "                     save the configuration of FILE as a model file\n"
          "\n"
          "options:\n"
          "  --platform KIND          platform kind: a number 0..14 or a name such as nxt, vexpic,\n"
@@ -54,6 +61,8 @@ const char *usageText() {
          "  --external-controllers   enable \"External Motor/Servo Controllers\"\n"
          "  -i, --in-place           format: rewrite the files instead of printing them\n"
          "  --check                  format: change nothing; exit 1 when a block is not in generated form\n"
+         "  -v, --verbose            diff: list the devices that differ\n"
+         "  -o, --output OUT         save-model: the model file to write\n"
          "  -h, --help               show this help\n"
          "  --version                show the version\n"
          "\n"
@@ -113,6 +122,10 @@ bool parseOptions(int argc, char **argv, TOptions &options, std::string &sError)
       else if (sArg == "--version") options.bVersion = true;
       else if (sArg == "-i" || sArg == "--in-place") options.bInPlace = true;
       else if (sArg == "--check") options.bCheckOnly = true;
+      else if (sArg == "-v" || sArg == "--verbose") options.bVerbose = true;
+      else if (sArg == "-o" || sArg == "--output") {
+        if (!takeValue(options.sOutputPath)) return false;
+      }
       else if (sArg == "--external-controllers") options.bExternalControllers = true;
       else if (sArg == "--platform") {
         if (!takeValue(sPlatform)) return false;
@@ -124,7 +137,7 @@ bool parseOptions(int argc, char **argv, TOptions &options, std::string &sError)
         sError = "unknown option '" + sArg + "'";
         return false;
       }
-      if (bHasValue && sArg != "--platform" && sArg != "--board") {
+      if (bHasValue && sArg != "--platform" && sArg != "--board" && sArg != "--output") {
         sError = "option '" + sArg + "' takes no value";
         return false;
       }
@@ -185,6 +198,28 @@ bool parseOptions(int argc, char **argv, TOptions &options, std::string &sError)
         return false;
       }
       break;
+    case TCommand::kDiff:
+      if (options.files.size() != 2) {
+        sError = "diff takes exactly two files";
+        return false;
+      }
+      break;
+    case TCommand::kModels:
+      if (!options.files.empty()) {
+        sError = "models takes no file";
+        return false;
+      }
+      break;
+    case TCommand::kSaveModel:
+      if (options.files.size() != 1 || options.sOutputPath.empty()) {
+        sError = "save-model takes one file and -o OUT";
+        return false;
+      }
+      break;
+  }
+  if (options.bVerbose && options.nCommand != TCommand::kDiff) {
+    sError = "-v applies to the diff command only";
+    return false;
   }
   if ((options.bInPlace || options.bCheckOnly) && options.nCommand != TCommand::kFormat) {
     sError = "-i and --check apply to the format command only";

@@ -6,7 +6,7 @@
 
 #include "host/DeviceTypes.h"
 
-enum class TCommand { kNone, kCheck, kFormat, kGenerate, kShow };
+enum class TCommand { kNone, kCheck, kFormat, kGenerate, kShow, kDiff, kModels, kSaveModel };
 
 struct TOptions {
   TCommand nCommand = TCommand::kNone;
@@ -16,6 +16,8 @@ struct TOptions {
   bool bExternalControllers = false;
   bool bInPlace = false;    ///< format -i
   bool bCheckOnly = false;  ///< format --check
+  bool bVerbose = false;    ///< diff -v
+  std::string sOutputPath;  ///< save-model -o
   bool bHelp = false;
   bool bVersion = false;
 };

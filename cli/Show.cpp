@@ -147,9 +147,11 @@ void printConfiguration(CRobotConfigurationBasic &config, std::string &sOut) {
              config.getCpuClockSpeed());
   appendLine(sOut, L"External Motor/Servo Controllers: %s",
              pToggles->bIsToggleEnabled(kToggleExternalControllers, kToggleQueryLevel) ? L"on" : L"off");
+  printBoardDetails(config, sOut);
   printHubs(config, sOut);
   printMotors(config, sOut);
   printServos(config, sOut);
   printSensors(config, sOut);
   printSerialPorts(config, sOut);
+  printDriveAndProgramDetails(config, sOut);
 }

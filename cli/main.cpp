@@ -34,6 +34,9 @@ int main(int argc, char **argv) {
     case TCommand::kFormat: nStatus = runFormat(options); break;
     case TCommand::kGenerate: nStatus = runGenerate(options); break;
     case TCommand::kShow: nStatus = runShow(options); break;
+    case TCommand::kDiff: nStatus = runDiff(options); break;
+    case TCommand::kModels: nStatus = runModels(options); break;
+    case TCommand::kSaveModel: nStatus = runSaveModel(options); break;
     case TCommand::kNone: break;
   }
   // Output that could not be written (a full disk, a closed pipe) is an I/O error.

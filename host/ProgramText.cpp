@@ -75,6 +75,9 @@ std::vector<TConfigurationDiagnostic> readProgramConfiguration(CRobotConfigurati
   }
   config.normalizeValuesAfterParsingConfiguration();
   config.validateMultiRobotNetworkDefinitionAfterParsingConfiguration();
+  // The IDE follows the board the program names, then checks the port rules.
+  config.modifyBoardTypeIfDifferentFromIDESetting();
+  config.checkEngineeringRules(true);
   return diagnostics;
 }
 
@@ -119,9 +122,9 @@ std::string replaceConfigurationBlock(const CProgramText &program, const CString
     size_t j = i;
     while (j < nLines && roles[j] == TLineRole::kBlank && !bRemove[j]) ++j;
     if (j < nLines && bRemove[j] && j > i && (roles[j] == TLineRole::kConfig || roles[j] == TLineRole::kMarker) &&
-        bRemove[i - 1] && false)
+        bRemove[i - 1])
       std::fill(bRemove.begin() + long(i), bRemove.begin() + long(j), true);
-    i = j; continue;
+    i = j;
   }
 
   const bool bHadBlock = nBlockStart < nLines;
