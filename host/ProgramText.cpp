@@ -3,7 +3,9 @@
 #include <algorithm>
 
 CProgramText::CProgramText(std::string sBytes) : m_sBytes(std::move(sBytes)) {
-  size_t nStart = 0;
+  // An editor's UTF-8 byte-order mark would otherwise hide a configuration line 1.
+  if (m_sBytes.compare(0, 3, "\xEF\xBB\xBF") == 0) m_nBomLength = 3;
+  size_t nStart = m_nBomLength;
   bool bFirstEnd = true;
   while (nStart < m_sBytes.size()) {
     const size_t nNewline = m_sBytes.find('\n', nStart);
@@ -135,7 +137,7 @@ std::string replaceConfigurationBlock(const CProgramText &program, const CString
     sBlock = CString(sConfigEmptyBlockMarker).toUtf8() + program.lineEnding() + program.lineEnding();
   }
 
-  std::string sOut;
+  std::string sOut(program.byteOrderMark());
   sOut.reserve(program.bytes().size() + sBlock.size());
   if (!bHadBlock) sOut += sBlock;
   for (size_t i = 0; i < nLines; ++i) {

@@ -29,11 +29,14 @@ class CProgramText {
   CString lineString(size_t nIndex) const { return CString::fromUtf8(lineText(nIndex)); }
   /// The line end the program uses: that of its first line, "\n" by default.
   const char *lineEnding() const { return m_bCrLf ? "\r\n" : "\n"; }
+  /// The byte-order mark the text starts with ("" when none); it belongs to no line.
+  std::string_view byteOrderMark() const { return std::string_view(m_sBytes).substr(0, m_nBomLength); }
 
  private:
   std::string m_sBytes;
   std::vector<TLine> m_lines;
   bool m_bCrLf = false;
+  size_t m_nBomLength = 0;
 };
 
 /// A configuration line the record refused.

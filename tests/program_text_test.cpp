@@ -179,3 +179,16 @@ TEST(ProgramText, GeneratedBlockTakesTheProgramsLineEnding) {
 }
 
 }  // namespace
+
+namespace {
+
+TEST(ProgramText, ByteOrderMarkBelongsToNoLineAndIsKept) {
+  const std::string kBom = "\xEF\xBB\xBF";
+  const CProgramText text(kBom + "#pragma config(UserModel, \"m\")\nint x;\n");
+  EXPECT_EQ(text.byteOrderMark(), kBom);
+  EXPECT_EQ(text.lineText(0), "#pragma config(UserModel, \"m\")");
+  EXPECT_EQ(replaced(kBom + "#pragma config(UserModel, \"old\")\nint x;\n"), kBom + kBlock + "int x;\n");
+  EXPECT_EQ(replaced(kBom + "int x;\n"), kBom + kBlock + "int x;\n");
+}
+
+}  // namespace
