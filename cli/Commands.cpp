@@ -3,7 +3,7 @@
 #include <cstdio>
 #include <memory>
 
-#include "cli/FileIO.h"
+#include "host/FileIO.h"
 #include "host/HostConfiguration.h"
 #include "host/HostMessages.h"
 #include "host/ProgramText.h"

@@ -1,5 +1,6 @@
 // robotcfg: checks, formats and shows the configuration block of robot programs.
 #include <cerrno>
+#include <csignal>
 #include <cstdio>
 #include <cstring>
 #include <string>
@@ -13,6 +14,8 @@
 #endif
 
 int main(int argc, char **argv) {
+  // A file-size limit must fail the write (and leave the program intact), not kill the tool.
+  std::signal(SIGXFSZ, SIG_IGN);
   TOptions options;
   std::string sError;
   if (!parseOptions(argc, argv, options, sError)) {

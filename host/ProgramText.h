@@ -25,8 +25,14 @@ class CProgramText {
   const std::vector<TLine> &lines() const { return m_lines; }
   /// A line's text without its line end.
   std::string_view lineText(size_t nIndex) const;
-  /// A line's text decoded for the tokenizer (undecodable bytes kept).
-  CString lineString(size_t nIndex) const { return CString::fromUtf8(lineText(nIndex)); }
+  /// Longest part of a line that is decoded: configuration words sit at a
+  /// line's start, and a huge line must not cost four times its size.
+  static constexpr size_t kMaxDecodedLineBytes = size_t(1) << 20;
+  /// A line's text decoded for the tokenizer (undecodable bytes kept), cut
+  /// to its first kMaxDecodedLineBytes bytes.
+  CString lineString(size_t nIndex) const {
+    return CString::fromUtf8(lineText(nIndex).substr(0, kMaxDecodedLineBytes));
+  }
   /// The line end the program uses: that of its first line, "\n" by default.
   const char *lineEnding() const { return m_bCrLf ? "\r\n" : "\n"; }
   /// The byte-order mark the text starts with ("" when none); it belongs to no line.

@@ -1,4 +1,4 @@
-#include "cli/FileIO.h"
+#include "host/FileIO.h"
 
 #include <fcntl.h>
 #include <sys/stat.h>
@@ -6,6 +6,7 @@
 
 #include <cerrno>
 #include <cstdio>
+#include <cstdlib>
 #include <cstring>
 #include <vector>
 
@@ -71,29 +72,37 @@ bool readProgramFile(const std::string &sPath, std::string &sBytes, std::string 
 }
 
 bool writeFileAtomically(const std::string &sPath, const std::string &sBytes, std::string &sError) {
-  struct stat info {};
-  if (::stat(sPath.c_str(), &info) != 0) {
+  // A symbolic link stays a link: the file it points to is the one replaced.
+  char *pzResolved = ::realpath(sPath.c_str(), nullptr);
+  if (!pzResolved) {
     sError = errorText("rewrite", sPath);
     return false;
   }
-  std::string sTemp = sPath + ".robotcfg-XXXXXX";
+  const std::string sTarget = pzResolved;
+  std::free(pzResolved);
+  struct stat info {};
+  if (::stat(sTarget.c_str(), &info) != 0) {
+    sError = errorText("rewrite", sPath);
+    return false;
+  }
+  std::string sTemp = sTarget + ".robotcfg-XXXXXX";
   std::vector<char> templ(sTemp.begin(), sTemp.end());
   templ.push_back('\0');
   const int fd = ::mkstemp(templ.data());
   if (fd < 0) {
-    sError = errorText("create a temporary file beside", sPath);
+    sError = errorText("create a temporary file beside", sPath) + "; the file is unchanged";
     return false;
   }
   sTemp = templ.data();
   bool bOk = writeAll(fd, sBytes) && ::fchmod(fd, info.st_mode & 07777) == 0 && ::fsync(fd) == 0;
-  if (!bOk) sError = errorText("write", sTemp);
+  if (!bOk) sError = errorText("rewrite", sPath) + "; the file is unchanged";
   if (::close(fd) != 0 && bOk) {
     bOk = false;
-    sError = errorText("write", sTemp);
+    sError = errorText("rewrite", sPath) + "; the file is unchanged";
   }
-  if (bOk && ::rename(sTemp.c_str(), sPath.c_str()) != 0) {
+  if (bOk && ::rename(sTemp.c_str(), sTarget.c_str()) != 0) {
     bOk = false;
-    sError = errorText("replace", sPath);
+    sError = errorText("replace", sPath) + "; the file is unchanged";
   }
   if (!bOk) ::unlink(sTemp.c_str());
   return bOk;
