@@ -8,6 +8,7 @@
 #include "cli/Commands.h"
 #include "cli/Options.h"
 #include "host/Platform.h"
+#include "host/StandardModelList.h"
 
 #ifndef ROBOTCONFIG_VERSION
 #define ROBOTCONFIG_VERSION "0.1.0"
@@ -31,6 +32,7 @@ int main(int argc, char **argv) {
     return kExitOk;
   }
   selectHostPlatform(options.nPlatformKind, options.nBoard, options.bExternalControllers);
+  installHostStandardModelList();
   int nStatus = kExitUsage;
   switch (options.nCommand) {
     case TCommand::kCheck: nStatus = runCheck(options); break;

@@ -1,7 +1,13 @@
 #include <cstring>
+#include <type_traits>
 
 #include "core/RobotConfiguration.h"
 #include "host/Networking.h"
+
+// The settings block is compared as raw memory, so it must hold no padding:
+// bytes no member owns would make equal settings compare different.
+static_assert(std::has_unique_object_representations_v<TConfigurationSettings>,
+              "settings block must have no padding bytes");
 
 CRobotConfigurationBasic::CRobotConfigurationBasic(const CRobotConfigurationBasic &source)
     : nHostData(source.nHostData),
@@ -17,13 +23,12 @@ CRobotConfigurationBasic::CRobotConfigurationBasic(const CRobotConfigurationBasi
       sensorNameLines(source.sensorNameLines),
       servoNameLines(source.servoNameLines),
       pNtwkInfo(new Networking::CNtwkInfoFromPragmas(*source.pNtwkInfo)),
+      settings(source.settings),
+      parseInfo(source.parseInfo),
       bHubDefaultNamesConfigured(source.bHubDefaultNamesConfigured),
       sSourceCode(source.sSourceCode),
       bDigitalPortWarningShown(source.bDigitalPortWarningShown),
-      bQuadPortErrorShown(source.bQuadPortErrorShown) {
-  std::memcpy(static_cast<void *>(&settings), &source.settings, sizeof settings);
-  std::memcpy(static_cast<void *>(&parseInfo), &source.parseInfo, sizeof parseInfo);
-}
+      bQuadPortErrorShown(source.bQuadPortErrorShown) {}
 
 TConfigCompareResults CRobotConfigurationBasic::compareConfiguration(const CRobotConfigurationBasic &other) const {
   // Every setting counts, padding included: a clear keeps the block zero-filled.

@@ -47,6 +47,7 @@ struct TMotorSlot {
   bool bEncoder;
   bool bPIDControlled;
   bool bReversed;
+  uint8_t nSpareByte = 0;  ///< named so that the slot has no padding
   TMotorDriveSide nDriveSide;  ///< 0 none, 1 left, 2 right
   int32_t nEncoderPort;        ///< sensor port of the encoder, -1 none
   int32_t nPrimaryIOPin;       ///< sensor port of the first IO pin, -1 none
@@ -69,6 +70,7 @@ struct TConfigurationSettings {
   std::array<uint16_t, 5> nDriveTrainWheels;
   std::array<uint8_t, 4> nDriveTrainMotorIndex;   ///< 255 none
   uint8_t nDriveTrainType;
+  uint8_t nSpareByte = 0;  ///< named so that the block has no padding
   std::array<TMotorSlot, kMaxNumbOfMotors> motors;
   const TMotorIOPinsDefinition *pMotorIOPinTable;  ///< board's pin table, not owned
   int32_t nNumbOfEntriesInMotorIOPinTable;
@@ -89,6 +91,7 @@ struct TConfigurationSettings {
   int32_t nCpuClockSpeed;
   std::array<std::array<TSensorPortHub, kNumbOfHubChainPositions>, kNumbOfHubSensorPorts> nSensorPortHubs;
   std::array<int32_t, kMaxNumbOfSensorPorts> nSecondaryPorts;  ///< -1 none
+  int32_t nSpareTailWord = 0;  ///< named so that the block has no padding
 };
 
 /// Definition lines and values derived while reading.
@@ -228,6 +231,10 @@ class CRobotConfigurationBasic {
   // ---- Reading a program ------------------------------------------------
   /// Classifies one source line and splits a configuration line into tokens.
   static TTokenizedLineType nTokenizeLine(const CString &sLine, TTokenizedConfigParms &parms);
+  /// The same, and `bCut` tells whether a configuration line held more than
+  /// the tokens kept: a word longer than 99 characters, or words after the 13th.
+  static TTokenizedLineType nTokenizeLineReportingCuts(const CString &sLine, TTokenizedConfigParms &parms,
+                                                       bool &bCut);
   /// Reads one tokenized configuration line; false = rejected, message in sError.
   bool bParseConfigDefinitionLine(const TTokenizedConfigParms &parms, bool bFlag, TLineNumber line,
                                   const CString &sSourceFile, CString &sError);

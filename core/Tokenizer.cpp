@@ -36,8 +36,8 @@ size_t skipBlanks(TLineView line, size_t pos) {
 
 /// Reads the token that starts at `pos` (which must be inside the line),
 /// moves `pos` past what the token consumed, and returns the token cut to
-/// kMaxConfigTokenLength characters.
-TLineView readToken(TLineView line, size_t &pos) {
+/// kMaxConfigTokenLength characters; `bCut` tells whether it was longer.
+TLineView readToken(TLineView line, size_t &pos, bool &bCut) {
   const size_t nLength = line.size();
   size_t nFirst = pos;
   size_t nEnd = pos;
@@ -59,6 +59,7 @@ TLineView readToken(TLineView line, size_t &pos) {
     }
     nEnd = pos;
   }
+  bCut = nEnd - nFirst > static_cast<size_t>(kMaxConfigTokenLength);
   return line.substr(nFirst, std::min(nEnd - nFirst, static_cast<size_t>(kMaxConfigTokenLength)));
 }
 
@@ -73,6 +74,13 @@ inline void storeToken(TTokenizedConfigParms &parms, int nIndex, TLineView token
 }  // namespace
 
 TTokenizedLineType CRobotConfigurationBasic::nTokenizeLine(const CString &sLine, TTokenizedConfigParms &parms) {
+  bool bCut = false;
+  return nTokenizeLineReportingCuts(sLine, parms, bCut);
+}
+
+TTokenizedLineType CRobotConfigurationBasic::nTokenizeLineReportingCuts(const CString &sLine,
+                                                                        TTokenizedConfigParms &parms, bool &bCut) {
+  bCut = false;
   const TLineView line(sLine.str());
   const TLineView startMarker(sConfigStartMarker);
   const TLineView endMarker(sConfigEndMarker);
@@ -89,8 +97,10 @@ TTokenizedLineType CRobotConfigurationBasic::nTokenizeLine(const CString &sLine,
   for (;;) {
     pos = skipBlanks(line, pos);
     if (pos == line.size()) break;
-    const TLineView token = readToken(line, pos);
+    bool bTokenCut = false;
+    const TLineView token = readToken(line, pos, bTokenCut);
     bLastTokenIsCloseParen = token == L")";
+    if (state == TTokenizerState::kKeyword || state == TTokenizerState::kParameters) bCut = bCut || bTokenCut;
 
     switch (state) {
       case TTokenizerState::kFirstToken:
@@ -146,7 +156,12 @@ TTokenizedLineType CRobotConfigurationBasic::nTokenizeLine(const CString &sLine,
       ++pos;
     else if (next != L')' && n > 0)
       break;
-    if (n >= kMaxConfigTokens) break;
+    if (n >= kMaxConfigTokens) {
+      // Words after the last one stored are dropped unless only ")" follows.
+      pos = skipBlanks(line, pos);
+      if (state == TTokenizerState::kParameters && pos < line.size() && line[pos] != L')') bCut = true;
+      break;
+    }
   }
 
   // The closing parenthesis is read as a token but is not a parameter.

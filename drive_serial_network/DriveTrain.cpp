@@ -1,40 +1,332 @@
-#include "core/PendingKeywords.h"
+// Drive train, gripper arm and joystick drive: the motor slots that form
+// them, the operations of the setup dialogs, and their four configuration
+// lines in both directions. Drive-train and gripper slots hold motor
+// indexes; a slot's type and direction are those of the motor it names.
+#include <algorithm>
+
 #include "core/RobotConfiguration.h"
+#include "host/DeviceCatalog.h"
+#include "host/Platform.h"
 
-void CRobotConfigurationBasic::clearDriveTrain() {}
-void CRobotConfigurationBasic::setDriveTrainType(TDriveTrainType) {}
-void CRobotConfigurationBasic::setGripperArmType(TGripperArmType) {}
-int CRobotConfigurationBasic::getDriveTrainMotorIndex(int) const { return -1; }
-void CRobotConfigurationBasic::setDriveTrainMotorIndex(int, int) {}
-TMotorTypes CRobotConfigurationBasic::getDriveTrainMotorType(int) const { return 0; }
-void CRobotConfigurationBasic::setDriveTrainMotorType(int, TMotorTypes) {}
-bool CRobotConfigurationBasic::getDriveTrainMotorReversed(int) const { return false; }
-void CRobotConfigurationBasic::setDriveTrainMotorReversed(int, bool) {}
-int CRobotConfigurationBasic::getGripperArmMotorIndex(int) const { return -1; }
-void CRobotConfigurationBasic::setGripperArmMotorIndex(int, int) {}
-TMotorTypes CRobotConfigurationBasic::getGripperArmMotorType(int) const { return 0; }
-void CRobotConfigurationBasic::setGripperArmMotorType(int, TMotorTypes) {}
-bool CRobotConfigurationBasic::getGripperArmMotorReversed(int) const { return false; }
-void CRobotConfigurationBasic::setGripperArmMotorReversed(int, bool) {}
-void CRobotConfigurationBasic::initializeEmptyMotor(int) {}
+namespace {
 
-bool CRobotConfigurationBasic::bParseConfigDefinitionLineDriveTrainMotors(const TTokenizedConfigParms &parms, bool, TLineNumber, CString &sError) {
-  return bRejectKeywordNotYetSupported(parms, sError);
+/// Hardware-type mask the drive-train menus are read with.
+constexpr TSensorHWTypesMask kDriveMenuMask = 7;
+
+/// Empty drive-train slot (the slots are bytes).
+constexpr uint8_t kNoDriveTrainMotor = 255;
+/// Empty gripper slot.
+constexpr int32_t kNoGripperMotor = -1;
+
+/// Wheel numbers of a record without a drive train.
+constexpr std::array<uint16_t, 5> kDefaultDriveTrainWheels = {0, 1, 1, 0, 0};
+
+/// Gripper slots that may stay empty without failing a GripperArm line.
+constexpr std::array<bool, 4> kOptionalGripperSlot = {false, true, false, true};
+
+/// Parameter word the readers take for "no motor in this slot".
+constexpr const wchar_t *kNoMotorWord = L"None";
+
+/// Tokens a line really holds (keyword included), never more than the token array.
+int numbOfTokens(const TTokenizedConfigParms &parms) { return std::clamp(parms.nNumbOfParms, 0, kMaxConfigTokens); }
+
+/// True when `nMotor` is a motor index of the current platform.
+bool bIsValidMotorIndex(const CRobotConfigurationBasic &rec, int nMotor) {
+  return CRobotConfigurationBasic::bIsMotorIndex(nMotor) && nMotor < rec.getMaxNumbOfMotorPorts();
 }
 
-bool CRobotConfigurationBasic::bParseConfigDefinitionLineDriveTrainWheels(const TTokenizedConfigParms &parms, bool, TLineNumber, CString &sError) {
-  return bRejectKeywordNotYetSupported(parms, sError);
+/// The catalog's word for a menu value; the value in decimal when the catalog
+/// has no row for it, so that the written line is never missing its word.
+CString menuWordOrNumber(const TDeviceTypeMenuItem *pTable, int nValue) {
+  CString sWord(getTypedefEnumString(pTable, nValue, kDriveMenuMask));
+  if (sWord.IsEmpty()) sWord.Format(L"%d", nValue);
+  return sWord;
 }
 
-bool CRobotConfigurationBasic::bParseConfigDefinitionLineGripperArm(const TTokenizedConfigParms &parms, bool, TLineNumber, CString &sError) {
-  return bRejectKeywordNotYetSupported(parms, sError);
+/// The word a written drive-train or gripper line uses for a slot's motor:
+/// its port name, or "None" for an empty slot or a motor without a name.
+CString slotMotorWord(const CRobotConfigurationBasic &rec, int nMotor, bool bEmpty) {
+  CString sName;
+  if (!bEmpty) rec.getDefaultMotorNameForPlatformOrControllerBoard(nMotor, sName);
+  return sName.IsEmpty() ? CString(kNoMotorWord) : sName;
 }
 
-bool CRobotConfigurationBasic::bParseConfigDefinitionLineJoystickDrive(const TTokenizedConfigParms &parms, bool, TLineNumber, CString &sError) {
-  return bRejectKeywordNotYetSupported(parms, sError);
+/// Stores `value` in slot `nSlot` when the slot exists; anything else is ignored.
+template <class T, size_t N>
+void storeInSlot(std::array<T, N> &slots, int nSlot, T value) {
+  if (nSlot >= 0 && size_t(nSlot) < N) slots[size_t(nSlot)] = value;
 }
 
-bool CRobotConfigurationBasic::buildSourceCodeForDriveTrainMotors() { return false; }
-bool CRobotConfigurationBasic::buildSourceCodeForDriveTrainWheels() { return false; }
-bool CRobotConfigurationBasic::buildSourceCodeForGripperArm() { return false; }
-bool CRobotConfigurationBasic::buildSourceCodeForGameController() { return false; }
+}  // namespace
+
+// ---- Operations ---------------------------------------------------------------
+
+void CRobotConfigurationBasic::clearDriveTrain() {
+  settings.nDriveTrainType = 0;
+  settings.nDriveTrainMotorIndex.fill(kNoDriveTrainMotor);
+  settings.nDriveTrainWheels = kDefaultDriveTrainWheels;
+}
+
+void CRobotConfigurationBasic::setDriveTrainType(TDriveTrainType nType) {
+  settings.nDriveTrainType = static_cast<uint8_t>(nType);
+  const int nCount = getNumbOfMotorsForDriveTrain();
+  for (int nSlot = nCount; nSlot < static_cast<int>(settings.nDriveTrainMotorIndex.size()); ++nSlot)
+    settings.nDriveTrainMotorIndex[size_t(nSlot)] = kNoDriveTrainMotor;
+  if (settings.nDriveTrainType == 0) settings.nDriveTrainWheels = kDefaultDriveTrainWheels;
+}
+
+void CRobotConfigurationBasic::setGripperArmType(TGripperArmType nType) {
+  settings.nGripperArmType = nType;
+  if (getNumbOfMotorsForGripperArm() == 0) settings.nGripperArmMotorIndex.fill(kNoGripperMotor);
+}
+
+int CRobotConfigurationBasic::getDriveTrainMotorIndex(int nSlot) const {
+  if (nSlot < 0 || nSlot >= getNumbOfMotorsForDriveTrain()) return -1;
+  return settings.nDriveTrainMotorIndex[size_t(nSlot)];
+}
+
+void CRobotConfigurationBasic::setDriveTrainMotorIndex(int nSlot, int nMotor) {
+  const bool bSlotValid = nSlot >= 0 && nSlot < getNumbOfMotorsForDriveTrain();
+  if (!bSlotValid || !bIsValidMotorIndex(*this, nMotor)) {
+    storeInSlot(settings.nDriveTrainMotorIndex, nSlot, kNoDriveTrainMotor);
+    return;
+  }
+  settings.nDriveTrainMotorIndex[size_t(nSlot)] = static_cast<uint8_t>(nMotor);
+  // A drive motor needs a type; an empty motor slot gets the platform's default.
+  if (settings.motors[size_t(nMotor)].nMotorType <= 0) setMotorTypeInConfig(nMotor, getDefaultMotorType(nMotor));
+}
+
+TMotorTypes CRobotConfigurationBasic::getDriveTrainMotorType(int nSlot) const {
+  const int nMotor = getDriveTrainMotorIndex(nSlot);
+  return bIsValidMotorIndex(*this, nMotor) ? settings.motors[size_t(nMotor)].nMotorType : 0;
+}
+
+void CRobotConfigurationBasic::setDriveTrainMotorType(int nSlot, TMotorTypes nType) {
+  const int nMotor = getDriveTrainMotorIndex(nSlot);
+  if (bIsValidMotorIndex(*this, nMotor)) setMotorTypeInConfig(nMotor, nType);
+}
+
+bool CRobotConfigurationBasic::getDriveTrainMotorReversed(int nSlot) const {
+  const int nMotor = getDriveTrainMotorIndex(nSlot);
+  return bIsValidMotorIndex(*this, nMotor) && settings.motors[size_t(nMotor)].bReversed;
+}
+
+void CRobotConfigurationBasic::setDriveTrainMotorReversed(int nSlot, bool bReversed) {
+  const int nMotor = getDriveTrainMotorIndex(nSlot);
+  if (bIsValidMotorIndex(*this, nMotor)) settings.motors[size_t(nMotor)].bReversed = bReversed;
+}
+
+int CRobotConfigurationBasic::getGripperArmMotorIndex(int nSlot) const {
+  if (nSlot < 0 || nSlot >= getNumbOfMotorsForGripperArm()) return -1;
+  return settings.nGripperArmMotorIndex[size_t(nSlot)];
+}
+
+void CRobotConfigurationBasic::setGripperArmMotorIndex(int nSlot, int nMotor) {
+  const bool bSlotValid = nSlot >= 0 && nSlot < getNumbOfMotorsForGripperArm();
+  if (!bSlotValid || !bIsValidMotorIndex(*this, nMotor)) {
+    storeInSlot(settings.nGripperArmMotorIndex, nSlot, kNoGripperMotor);
+    return;
+  }
+  settings.nGripperArmMotorIndex[size_t(nSlot)] = nMotor;
+  if (settings.motors[size_t(nMotor)].nMotorType <= 0) setMotorTypeInConfig(nMotor, getDefaultMotorType(nMotor));
+}
+
+TMotorTypes CRobotConfigurationBasic::getGripperArmMotorType(int nSlot) const {
+  const int nMotor = getGripperArmMotorIndex(nSlot);
+  return bIsValidMotorIndex(*this, nMotor) ? settings.motors[size_t(nMotor)].nMotorType : 0;
+}
+
+void CRobotConfigurationBasic::setGripperArmMotorType(int nSlot, TMotorTypes nType) {
+  const int nMotor = getGripperArmMotorIndex(nSlot);
+  if (bIsValidMotorIndex(*this, nMotor)) setMotorTypeInConfig(nMotor, nType);
+}
+
+bool CRobotConfigurationBasic::getGripperArmMotorReversed(int nSlot) const {
+  const int nMotor = getGripperArmMotorIndex(nSlot);
+  return bIsValidMotorIndex(*this, nMotor) && settings.motors[size_t(nMotor)].bReversed;
+}
+
+void CRobotConfigurationBasic::setGripperArmMotorReversed(int nSlot, bool bReversed) {
+  const int nMotor = getGripperArmMotorIndex(nSlot);
+  if (bIsValidMotorIndex(*this, nMotor)) settings.motors[size_t(nMotor)].bReversed = bReversed;
+}
+
+void CRobotConfigurationBasic::initializeEmptyMotor(int nMotor) {
+  if (!bIsMotorIndex(nMotor)) return;
+  TMotorSlot &motor = settings.motors[size_t(nMotor)];
+  motor.nMotorType = 0;
+  motor.bEncoder = false;
+  motor.bPIDControlled = false;
+  motor.bReversed = false;
+  motor.nDriveSide = 0;
+  motor.nEncoderPort = 0;
+  motor.nPrimaryIOPin = -1;
+  motor.nSecondaryIOPin = -1;
+  motor.pidSettings.clearPidSettings();
+}
+
+// ---- Readers --------------------------------------------------------------------
+
+bool CRobotConfigurationBasic::bParseConfigDefinitionLineDriveTrainMotors(const TTokenizedConfigParms &parms, bool,
+                                                                          TLineNumber, CString &sError) {
+  if (!pPlatformData->pPlatformParms->bSupportsDriveTrainConfig) {
+    sError = L"Drive Train configuration not supported by platform";
+    return false;
+  }
+  // A word the menu lacks is kept as a type with no motors (255).
+  settings.nDriveTrainType = static_cast<uint8_t>(getTypedefIndex(nDriveTrainTypes, parms.sParms[1], true));
+  bool bAccepted = true;
+  const int nTokens = numbOfTokens(parms);
+  for (int nToken = 2; nToken < nTokens; ++nToken) {
+    const int nSlot = nToken - 2;
+    const CString &sWord = parms.sParms[size_t(nToken)];
+    if (sWord.IsEmpty()) {
+      sError = L"Not enough motors specified";
+      settings.nDriveTrainType = 0;
+      return false;
+    }
+    const bool bNoMotor = sWord == kNoMotorWord;
+    const int nMotor = bNoMotor ? -1 : getIndexForDefaultMotorName(sWord);
+    setDriveTrainMotorIndex(nSlot, nMotor);
+    // A name of a motor the platform does not have is as invalid as an unknown one.
+    if (bIsValidMotorIndex(*this, nMotor)) continue;
+    if (bAccepted) {
+      if (bNoMotor) sError.Format(L"No motor specified for index %d.", nSlot);
+      else sError.Format(L"Invalid motor '%s' for index %d.", sWord, nSlot);
+    }
+    bAccepted = false;
+  }
+  return bAccepted;
+}
+
+bool CRobotConfigurationBasic::bParseConfigDefinitionLineDriveTrainWheels(const TTokenizedConfigParms &parms, bool,
+                                                                          TLineNumber, CString &sError) {
+  if (!pPlatformData->pPlatformParms->bSupportsDriveTrainConfig) {
+    sError = L"Drive Train configuration not supported by platform";
+    return false;
+  }
+  bool bAccepted = true;
+  const int nTokens = numbOfTokens(parms);
+  for (int nToken = 1; nToken < nTokens; ++nToken) {
+    const CString &sWord = parms.sParms[size_t(nToken)];
+    if (sWord.IsEmpty()) {
+      sError.Empty();
+      return false;
+    }
+    bool bNumber = false;
+    const int nValue = sWord == kNoMotorWord ? 0 : getInteger(sWord, bNumber);
+    const int nWheel = nToken - 1;
+    if (size_t(nWheel) < settings.nDriveTrainWheels.size()) {
+      settings.nDriveTrainWheels[size_t(nWheel)] = static_cast<uint16_t>(nValue);
+    } else {
+      sError.Empty();
+      bAccepted = false;
+    }
+  }
+  return bAccepted;
+}
+
+bool CRobotConfigurationBasic::bParseConfigDefinitionLineGripperArm(const TTokenizedConfigParms &parms, bool,
+                                                                    TLineNumber, CString &sError) {
+  if (!pPlatformData->pPlatformParms->bSupportsDriveTrainConfig) {
+    sError = L"Gripper Arm configuration not supported by platform";
+    return false;
+  }
+  settings.nGripperArmType = getTypedefIndex(nGripperArmTypes, parms.sParms[1], true);
+  bool bAccepted = true;
+  const int nTokens = numbOfTokens(parms);
+  for (int nToken = 2; nToken < nTokens; ++nToken) {
+    const int nSlot = nToken - 2;
+    const CString &sWord = parms.sParms[size_t(nToken)];
+    if (sWord.IsEmpty()) {
+      sError = L"Not enough motors specified";
+      settings.nGripperArmType = 0;
+      return false;
+    }
+    const bool bNoMotor = sWord == kNoMotorWord;
+    const int nMotor = bNoMotor ? -1 : getIndexForDefaultMotorName(sWord);
+    setGripperArmMotorIndex(nSlot, nMotor);
+    if (bIsValidMotorIndex(*this, nMotor)) continue;
+    if (size_t(nSlot) < kOptionalGripperSlot.size() && kOptionalGripperSlot[size_t(nSlot)]) continue;
+    if (bAccepted) {
+      if (bNoMotor) sError.Format(L"No motor specified for index %d.", nSlot);
+      else sError.Format(L"Invalid motor '%s' for index %d.", sWord, nSlot);
+    }
+    bAccepted = false;
+  }
+  return bAccepted;
+}
+
+bool CRobotConfigurationBasic::bParseConfigDefinitionLineJoystickDrive(const TTokenizedConfigParms &parms, bool,
+                                                                       TLineNumber, CString &sError) {
+  if (!pPlatformData->pPlatformParms->bSupportsJoystickDriveConfig) {
+    sError = L"Joystick control configuration not supported by platform";
+    return false;
+  }
+  // Unknown words are reported but do not reject the line.
+  settings.nJoystickMotorDriveType = getTypedefIndex(nJoystickDriveTypes, parms.sParms[1], true);
+  if (settings.nJoystickMotorDriveType < 0) {
+    sError.Format(L"Invalid motor drive type '%s'", parms.sParms[1]);
+    settings.nJoystickMotorDriveType = 0;
+  }
+  settings.nJoystickMotorAxisScaling = getTypedefIndex(nJoystickAxisScalingTypes, parms.sParms[2], true);
+  if (settings.nJoystickMotorAxisScaling < 0) {
+    sError.Format(L"Invalid joystick axis type '%s'", parms.sParms[2]);
+    settings.nJoystickMotorAxisScaling = 0;
+  }
+  return true;
+}
+
+// ---- Writers --------------------------------------------------------------------
+
+bool CRobotConfigurationBasic::buildSourceCodeForDriveTrainMotors() {
+  if (settings.nDriveTrainType == 0) return false;
+  CString sParameters = menuWordOrNumber(nDriveTrainTypes, settings.nDriveTrainType);
+  const int nCount = getNumbOfMotorsForDriveTrain();
+  for (int nSlot = 0; nSlot < nCount; ++nSlot) {
+    const int nMotor = settings.nDriveTrainMotorIndex[size_t(nSlot)];
+    sParameters += L", ";
+    sParameters += slotMotorWord(*this, nMotor, nMotor == kNoDriveTrainMotor);
+  }
+  CString sLine;
+  sLine.Format(L"#pragma config(%s, %s)", TConfigTypeDefns::getConfigTypeName(configTypeDriveTrainMotors),
+               sParameters);
+  addSourceLineToConfiguration(sLine);
+  return true;
+}
+
+bool CRobotConfigurationBasic::buildSourceCodeForDriveTrainWheels() {
+  if (settings.nDriveTrainType == 0) return false;
+  const std::array<uint16_t, 5> &wheels = settings.nDriveTrainWheels;
+  CString sWheels;
+  sWheels.Format(L"%d, %d, %d, %d, %d", wheels[0], wheels[1], wheels[2], wheels[3], wheels[4]);
+  CString sLine;
+  sLine.Format(L"#pragma config(%s, %s)", TConfigTypeDefns::getConfigTypeName(configTypeDriveTrainWheels), sWheels);
+  addSourceLineToConfiguration(sLine);
+  return true;
+}
+
+bool CRobotConfigurationBasic::buildSourceCodeForGripperArm() {
+  if (settings.nGripperArmType == 0) return false;
+  CString sParameters = menuWordOrNumber(nGripperArmTypes, settings.nGripperArmType);
+  if (getNumbOfMotorsForGripperArm() > 0) {
+    for (const int32_t nMotor : settings.nGripperArmMotorIndex) {
+      sParameters += L", ";
+      sParameters += slotMotorWord(*this, nMotor, nMotor == kNoGripperMotor);
+    }
+  }
+  CString sLine;
+  sLine.Format(L"#pragma config(%s, %s)", TConfigTypeDefns::getConfigTypeName(configTypeGripperArm), sParameters);
+  addSourceLineToConfiguration(sLine);
+  return true;
+}
+
+bool CRobotConfigurationBasic::buildSourceCodeForGameController() {
+  if (settings.nJoystickMotorDriveType == 0) return false;
+  CString sLine;
+  sLine.Format(L"#pragma config(%s, %s, %s)", TConfigTypeDefns::getConfigTypeName(configTypeJoystickDrive),
+               menuWordOrNumber(nJoystickDriveTypes, settings.nJoystickMotorDriveType),
+               menuWordOrNumber(nJoystickAxisScalingTypes, settings.nJoystickMotorAxisScaling));
+  addSourceLineToConfiguration(sLine);
+  return true;
+}

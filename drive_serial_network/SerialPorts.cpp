@@ -41,15 +41,19 @@ const TSerialPortsInfo *serialPortsOf(TControllerBoardType nBoard) {
   return pBoard ? pBoard->pSerialPorts : nullptr;
 }
 
+// The board's record of port `nPort` out of `nCount` ports; null when there is no such port.
+const TSerialPortIOPinsDefn *portRecord(const std::array<TSerialPortIOPinsDefn, 6> &pins, int nCount, int nPort) {
+  // A board may count more ports than it describes; only described ones have a record.
+  if (nPort < 0 || nPort >= nCount || nPort >= static_cast<int>(pins.size())) return nullptr;
+  return &pins[size_t(nPort)];
+}
+
 // Pins of port `nPort` out of `nCount` ports; both -1 when there is no such port.
 void pinsOfPort(const std::array<TSerialPortIOPinsDefn, 6> &pins, int nCount, int nPort, int &nFirstPin,
                 int &nSecondPin) {
-  nFirstPin = -1;
-  nSecondPin = -1;
-  // A board may count more ports than it describes; only described ones have pins.
-  if (nPort < 0 || nPort >= nCount || nPort >= static_cast<int>(pins.size())) return;
-  nFirstPin = pins[size_t(nPort)].nFirstPin;
-  nSecondPin = pins[size_t(nPort)].nSecondPin;
+  const TSerialPortIOPinsDefn *pRecord = portRecord(pins, nCount, nPort);
+  nFirstPin = pRecord ? pRecord->nFirstPin : -1;
+  nSecondPin = pRecord ? pRecord->nSecondPin : -1;
 }
 
 // The port (searched from the highest) that uses `nPin`.
@@ -126,4 +130,19 @@ bool CRobotConfigurationBasic::findI2CFromPin(int nPin, int &nPort, int &nFirstP
   nPort = nFirstPin = nSecondPin = -1;
   const TSerialPortsInfo *pPorts = serialPortsOf(settings.nCircuitBoardType);
   return pPorts && findPortFromPin(pPorts->i2cPins, pPorts->nNumbOfI2Cs, nPin, nPort, nFirstPin, nSecondPin);
+}
+
+bool CRobotConfigurationBasic::bCanSystemUartPortBeReconfigured() const {
+  const TSerialPortsInfo *pPorts = serialPortsOf(settings.nCircuitBoardType);
+  return pPorts && pPorts->bCanSystemUartBeReconfigured;
+}
+
+const TSerialPortIOPinsDefn *CRobotConfigurationBasic::getUARTPortIOPinDefinition(int nPort) const {
+  const TSerialPortsInfo *pPorts = serialPortsOf(settings.nCircuitBoardType);
+  return pPorts ? portRecord(pPorts->uartPins, pPorts->nNumbOfUARTs, nPort) : nullptr;
+}
+
+const TSerialPortIOPinsDefn *CRobotConfigurationBasic::getI2CPortIOPinDefinition(int nPort) const {
+  const TSerialPortsInfo *pPorts = serialPortsOf(settings.nCircuitBoardType);
+  return pPorts ? portRecord(pPorts->i2cPins, pPorts->nNumbOfI2Cs, nPort) : nullptr;
 }

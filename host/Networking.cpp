@@ -2,6 +2,35 @@
 
 namespace Networking {
 
+namespace {
+
+struct TNetworkTypeWord {
+  TNtwkType nType;
+  const wchar_t *pzWord;
+};
+
+// The kinds of XBee network a program can belong to.
+constexpr std::array<TNetworkTypeWord, 4> kNetworkTypeWords = {{
+    {0, L"ntwkXBee802_15_4"},
+    {1, L"ntwkXBeeZigBee"},
+    {2, L"ntwkXBeeDigiMesh"},
+    {3, L"ntwkXBeeWiFi"},
+}};
+
+}  // namespace
+
+TNtwkType getNetworkType(const CString &sWord) {
+  for (const TNetworkTypeWord &row : kNetworkTypeWords)
+    if (sWord == row.pzWord) return row.nType;
+  return -1;
+}
+
+const wchar_t *getNetworkTypeString(TNtwkType nType) {
+  for (const TNetworkTypeWord &row : kNetworkTypeWords)
+    if (row.nType == nType) return row.pzWord;
+  return L"";
+}
+
 bool TNtwkNodeInfo::operator==(const TNtwkNodeInfo &o) const {
   return sNodeName == o.sNodeName && nSerialNumber == o.nSerialNumber && nHardwareVersion == o.nHardwareVersion &&
          date.nDate == o.date.nDate && date.nTime == o.date.nTime && definitionLine == o.definitionLine;

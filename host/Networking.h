@@ -13,6 +13,8 @@ namespace Networking {
 
 typedef int32_t TNtwkType;          ///< network type, negative = none
 typedef int32_t THardwareVersions;  ///< radio hardware version
+/// The 8-byte address of an XBee radio, most significant byte first.
+typedef std::array<unsigned char, 8> TNodeSerialNumber;
 
 /// Most node entries one network definition keeps.
 constexpr int kMaxNodesInNetwork = 9;
@@ -22,7 +24,7 @@ constexpr uint16_t kNoNetworkNumber = 0xFFFF;
 /// One radio node of a network definition.
 struct TNtwkNodeInfo {
   CString sNodeName;
-  std::array<unsigned char, 8> nSerialNumber{};
+  TNodeSerialNumber nSerialNumber{};
   THardwareVersions nHardwareVersion = 0;
   TDateField date{0, 0};
   TLineNumber definitionLine;
@@ -43,6 +45,8 @@ class CNtwkInfoFromPragmas {
   unsigned short getNetworkNumber() const { return nNetworkNumber; }
   void setPrimaryNodeAddress(const unsigned char (&address)[8]);
   void getPrimaryNode(unsigned char (&address)[8]) const;
+  void setPrimaryNodeAddress(const TNodeSerialNumber &address) { nPrimaryNodeAddress = address; }
+  void getPrimaryNode(TNodeSerialNumber &address) const { address = nPrimaryNodeAddress; }
 
   bool operator==(const CNtwkInfoFromPragmas &o) const;
   bool operator!=(const CNtwkInfoFromPragmas &o) const { return !(*this == o); }
@@ -56,7 +60,14 @@ class CNtwkInfoFromPragmas {
   int32_t nNumbOfNodes = 0;
   std::array<TNtwkNodeInfo, kMaxNodesInNetwork> nodes;
   uint16_t nNetworkNumber = kNoNetworkNumber;
-  std::array<unsigned char, 8> nPrimaryNodeAddress{};
+  TNodeSerialNumber nPrimaryNodeAddress{};
 };
+
+/// Network type of a type word (compared exactly, with case); negative when
+/// the word names no network type.
+TNtwkType getNetworkType(const CString &sWord);
+/// The word of a network type, as getNetworkType accepts it; "" for a value
+/// that names no network type.
+const wchar_t *getNetworkTypeString(TNtwkType nType);
 
 }  // namespace Networking

@@ -68,9 +68,19 @@ std::vector<TConfigurationDiagnostic> readProgramConfiguration(CRobotConfigurati
   TTokenizedConfigParms parms;
   CString sError;
   for (size_t i = 0; i < program.lines().size(); ++i) {
-    if (CRobotConfigurationBasic::nTokenizeLine(program.lineString(i), parms) != lineTypeConfigPragma) continue;
+    bool bCut = false;
+    const CString sLine = program.lineString(i);
+    if (CRobotConfigurationBasic::nTokenizeLineReportingCuts(sLine, parms, bCut) != lineTypeConfigPragma) continue;
     const int nLine = static_cast<int>(i) + 1;
     sError.Empty();
+    // The record keeps only what the tokens hold; a rewritten block would drop the rest.
+    const bool bLineTooLong = program.lineText(i).size() > CProgramText::kMaxDecodedLineBytes;
+    if (bCut || bLineTooLong) {
+      CString sMessage;
+      sMessage.Format(L"'%s' configuration line holds more than is kept (at most 12 parameters of 99 characters)",
+                      parms.sParms[0]);
+      diagnostics.push_back({nLine, sMessage});
+    }
     if (config.bParseConfigDefinitionLine(parms, true, TLineNumber(nLine, 0), sPath, sError)) continue;
     if (sError.IsEmpty()) sError.Format(L"'%s' configuration line rejected", parms.sParms[0]);
     diagnostics.push_back({nLine, sError});

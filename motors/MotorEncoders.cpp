@@ -5,6 +5,8 @@ void CRobotConfigurationBasic::setMapEncoderToMotor(int nMotor, int nSensorPort)
 }
 
 void CRobotConfigurationBasic::removeMotorEncodersForSensorPort(int nSensorPort) {
+  // -1 is "no encoder port", not a port: it must not strip the motors without encoders.
+  if (nSensorPort < 0) return;
   for (TMotorSlot &motor : settings.motors)
     if (motor.nEncoderPort == nSensorPort) {
       motor.nEncoderPort = -1;

@@ -200,7 +200,9 @@ TSensorHWTypesMask CRobotConfigurationBasic::getAorDMotorTypeMask(int nMotor) co
     }
     case platformNxt:
     case platformBrick4Motor:
-      if (nMotor < getMaxNumbOfMotorPorts()) return 0x18;
+      // Built-in ports only: with external controllers on, the platform's
+      // motor count takes in the hub motors too.
+      if (nMotor < builtInMotorPorts(pToggles->getPlatformKind())) return 0x18;
       switch (getMotorMuxForMotor(nMotor)) {
         case hubHTMotor: return 0x20;
         case hubMatrxRbtcs: return 0x40;
@@ -213,7 +215,7 @@ TSensorHWTypesMask CRobotConfigurationBasic::getAorDMotorTypeMask(int nMotor) co
 
 TThirdPartyHWMask CRobotConfigurationBasic::getThirdPartyMotorTypeMask(int nMotor) const {
   const int nKind = pToggles->getPlatformKind();
-  if (!bIsHubPlatform(nKind) || nMotor < getMaxNumbOfMotorPorts()) return 0xFE;
+  if (!bIsHubPlatform(nKind) || nMotor < builtInMotorPorts(nKind)) return 0xFE;
   switch (getMotorMuxForMotor(nMotor)) {
     case hubHTMotor: return 4;
     case hubMatrxRbtcs: return 0x40;

@@ -1,18 +1,130 @@
-#include "core/PendingKeywords.h"
+#include <algorithm>
+
 #include "core/RobotConfiguration.h"
 #include "host/DeviceCatalog.h"
 #include "host/Platform.h"
 
-bool CRobotConfigurationBasic::bParseConfigDefinitionLineServo(const TTokenizedConfigParms &parms, bool, TLineNumber, CString &sError) {
-  return bRejectKeywordNotYetSupported(parms, sError);
+namespace {
+
+// Position of a SrvoPosition line that leaves a position empty.
+constexpr uint8_t kEmptyServoPosition = 128;
+// Largest value a servo position can hold.
+constexpr int kMaxServoPosition = 255;
+// Parameter of a SrvoPosition line that holds the first position (the name is parameter 1).
+constexpr int kFirstServoPositionParm = 2;
+
+// Reads one servo position; false when the text is neither empty nor a number 0..255.
+bool bReadServoPosition(const CString &sText, uint8_t &nPosition) {
+  if (sText.IsEmpty()) {
+    nPosition = kEmptyServoPosition;
+    return true;
+  }
+  bool bOk = false;
+  const int nValue = getInteger(sText, bOk);
+  if (!bOk || nValue < 0 || nValue > kMaxServoPosition) return false;
+  nPosition = static_cast<uint8_t>(nValue);
+  return true;
 }
 
-bool CRobotConfigurationBasic::bParseConfigDefinitionLineServoPositions(const TTokenizedConfigParms &parms, bool, TLineNumber, CString &sError) {
-  return bRejectKeywordNotYetSupported(parms, sError);
+}  // namespace
+
+bool CRobotConfigurationBasic::bParseConfigDefinitionLineServo(const TTokenizedConfigParms &parms, bool,
+                                                               TLineNumber line, CString &sError) {
+  const TServoTypes nType = getServoTypedefNameIndex(parms.sParms[3]);
+  const int nServo = getServoIndex(parms.sParms[1]);
+  if (!bIsServoIndex(nServo)) {
+    sError.Format(L"Bad servo device index '%s'", parms.sParms[1]);
+    return false;
+  }
+  // The writer only writes servos of the configured controllers; any other
+  // servo, or a type word it cannot spell back, would vanish from the program.
+  if (nServo >= pPlatformData->pPlatformParms->nNumbOfServoPorts || !bIsValidServoPort(nServo)) {
+    sError.Format(L"No servo controller for servo '%s'", parms.sParms[1]);
+    return false;
+  }
+  if (nType < 0) {
+    sError.Format(L"Bad servo type '%s'", parms.sParms[3]);
+    return false;
+  }
+  configureDefaultMotorAndServoNamesForEquippedHubs(false);
+  setUserDefinedServoNameInConfig(nServo, parms.sParms[2], line);
+  // Runs before the new type is stored, so the default name follows the servo's previous type.
+  if (parms.sParms[2].IsEmpty()) setEmptyServoNameToDefaultName(nServo);
+  setServoType(nServo, nType);
+  setServoDefinitionLine(nServo, line);
+  return true;
 }
 
-bool CRobotConfigurationBasic::buildSourceCodeForServos() { return false; }
-bool CRobotConfigurationBasic::buildSourceCodeForServoPositions() { return false; }
+bool CRobotConfigurationBasic::bParseConfigDefinitionLineServoPositions(const TTokenizedConfigParms &parms, bool,
+                                                                        TLineNumber, CString &sError) {
+  const int nSet = settings.nNumbOfServoPositions;
+  if (nSet < 0 || nSet >= kMaxNumbOfServoPositionSets) {
+    sError = L"Maximum limit of servo position settinge exceeded";
+    return false;
+  }
+  // A set without a name is never written back.
+  if (parms.sParms[1].IsEmpty()) {
+    sError.Format(L"Bad servo position set name '%s'", parms.sParms[1]);
+    return false;
+  }
+  std::array<uint8_t, kNumbOfServoPositionsPerSet> positions{};
+  for (int j = 0; j < kNumbOfServoPositionsPerSet; ++j) {
+    const CString &sPosition = parms.sParms[size_t(kFirstServoPositionParm + j)];
+    if (!bReadServoPosition(sPosition, positions[size_t(j)])) {
+      sError.Format(L"Bad servo position '%s'", sPosition);
+      return false;
+    }
+  }
+  // Positions beyond the eighth have no place in the set.
+  for (int k = kFirstServoPositionParm + kNumbOfServoPositionsPerSet; k < kMaxConfigTokens; ++k)
+    if (!parms.sParms[size_t(k)].IsEmpty()) {
+      sError.Format(L"Bad servo position '%s'", parms.sParms[size_t(k)]);
+      return false;
+    }
+  sServoPositionNames[size_t(nSet)] = parms.sParms[1];
+  settings.nServoPositions[size_t(nSet)] = positions;
+  settings.nNumbOfServoPositions = nSet + 1;
+  return true;
+}
+
+bool CRobotConfigurationBasic::buildSourceCodeForServos() {
+  const int nServos = std::min<int>(pPlatformData->pPlatformParms->nNumbOfServoPorts, kMaxNumbOfServos);
+  bool bWritten = false;
+  CString sPort, sLine;
+  for (int i = 0; i < nServos; ++i) {
+    const TServoTypes nType = settings.nServoTypes[size_t(i)];
+    const CString &sName = sServoNames[size_t(i)];
+    if (sName.IsEmpty() && nType == 0) continue;
+    if (!bIsValidServoPort(i)) continue;
+    getDefaultServoNameLowLevel(i, sPort, true);
+    sLine.Format(L"#pragma config(%s,  %-16s %-21s %s)", TConfigTypeDefns::getConfigTypeName(configTypeServo),
+                 sPort + L",", sName + L",", getServoTypedefString(nType));
+    addSourceLineToConfiguration(sLine);
+    bWritten = true;
+  }
+  return bWritten;
+}
+
+bool CRobotConfigurationBasic::buildSourceCodeForServoPositions() {
+  const int nSets = std::clamp<int>(settings.nNumbOfServoPositions, 0, kMaxNumbOfServoPositionSets);
+  bool bWritten = false;
+  CString sValues, sLine;
+  for (int nSet = 0; nSet < nSets; ++nSet) {
+    const CString &sName = sServoPositionNames[size_t(nSet)];
+    if (sName.IsEmpty()) continue;
+    const auto &positions = settings.nServoPositions[size_t(nSet)];
+    sValues.Format(L"%3d", positions[0]);
+    for (int j = 1; j < kNumbOfServoPositionsPerSet; ++j) {
+      const CString sSoFar(sValues);
+      sValues.Format(L"%s, %3d", sSoFar, positions[size_t(j)]);
+    }
+    sLine.Format(L"#pragma config(%s,  %-22s %s)", TConfigTypeDefns::getConfigTypeName(configTypeServoPosition),
+                 sName + L",", sValues);
+    addSourceLineToConfiguration(sLine);
+    bWritten = true;
+  }
+  return bWritten;
+}
 
 int CRobotConfigurationBasic::getMaxNumbOfServoPorts() const {
   // Servos exist only on the controllers that the toggle makes available.

@@ -2,12 +2,14 @@
 #include <gtest/gtest.h>
 
 #include <cstring>
+#include <fstream>
 #include <string>
 #include <vector>
 
 #include "host/DeviceCatalog.h"
 #include "host/HostConfiguration.h"
 #include "host/Platform.h"
+#include "tests/subprocess.h"
 
 namespace {
 
@@ -121,11 +123,11 @@ TEST_F(ConfigurationText, KeywordsOutsideTheTable) {
   EXPECT_TRUE(parseLine(rec, L"#pragma config(Start)", sError));
   EXPECT_TRUE(bSameSettings(rec, before));
 
-  // Keywords of the table reach their reader whatever their case.
+  // Keywords of the table reach their reader whatever their case (no motor ports on this platform).
   EXPECT_FALSE(parseLine(rec, L"#pragma config(Motor, port1, left, tmotorNormal)", sError));
-  EXPECT_EQ(sError, L"Configuration keyword 'Motor' is not supported yet");
-  EXPECT_FALSE(parseLine(rec, L"#pragma config(rEnAmEmOtOr, port1, left)", sError));
-  EXPECT_EQ(sError, L"Configuration keyword 'rEnAmEmOtOr' is not supported yet");
+  EXPECT_EQ(sError, L"Bad motor device index 'port1'");
+  EXPECT_FALSE(parseLine(rec, L"#pragma config(rEnAmEmOtOr, port2, left)", sError));
+  EXPECT_EQ(sError, L"Bad motor device index 'port2'");
 }
 
 TEST_F(ConfigurationText, CpuParametersAndAnalogLines) {
@@ -169,8 +171,16 @@ TEST_F(ConfigurationText, ClearedRecordWritesNothing) {
       selectHostPlatform(nKind, -1, bToggle);
       CHostRobotConfiguration rec;
       bool bWritten = true;
-      EXPECT_EQ(generate(rec, bWritten), L"") << "kind " << nKind;
-      EXPECT_FALSE(bWritten);
+      // Only the board platforms name their board: it came from the IDE, not from the platform.
+      const bool bBoardPlatform = nKind == platformArduino || nKind >= platformBoard10;
+      std::wstring sExpected;
+      if (bBoardPlatform)
+        sExpected = L"#pragma config(CircuitBoardType, " +
+                    std::wstring(getTypedefEnumString(getArduinoCircuitBoardTypeMenuDefn(),
+                                                      pToggles->getIDECircuitBoardType(), -1)) +
+                    L")\r\n" + kCommentLine + L"\r\n";
+      EXPECT_EQ(generate(rec, bWritten), sExpected) << "kind " << nKind;
+      EXPECT_EQ(bWritten, bBoardPlatform);
     }
   }
 }
@@ -182,7 +192,9 @@ TEST_F(ConfigurationText, CpuParametersWrittenOnlyWhenNotTheBoardDefault) {
   rec.setCpuClockSpeed(16000000);
   const std::wstring sText = generate(rec, bWritten);
   EXPECT_TRUE(bWritten);
-  EXPECT_EQ(sText, L"#pragma config(CPU_Parameters, ATmega328P, 16000000)\r\n" + kCommentLine + L"\r\n");
+  EXPECT_EQ(sText, L"#pragma config(CircuitBoardType, typeCktBoardFio)\r\n"
+                   L"#pragma config(CPU_Parameters, ATmega328P, 16000000)\r\n" +
+                       kCommentLine + L"\r\n");
   ASSERT_EQ(kCommentLine.size(), 88u);
 
   CHostRobotConfiguration copy;
@@ -192,8 +204,7 @@ TEST_F(ConfigurationText, CpuParametersWrittenOnlyWhenNotTheBoardDefault) {
   EXPECT_EQ(generate(copy, bWritten), sText);
 
   readBlock(copy, L"#pragma config(CPU_Parameters, ATmega328P, 8000000)\r\n");
-  EXPECT_EQ(generate(copy, bWritten), L"");
-  EXPECT_FALSE(bWritten);
+  EXPECT_EQ(generate(copy, bWritten), L"#pragma config(CircuitBoardType, typeCktBoardFio)\r\n" + kCommentLine + L"\r\n");
 
   // The clock line belongs to the board platform alone.
   selectHostPlatform(platformVexPic);
@@ -205,15 +216,20 @@ TEST_F(ConfigurationText, CpuParametersWrittenOnlyWhenNotTheBoardDefault) {
 
 TEST_F(ConfigurationText, UserModelLineReplacesTheOtherLines) {
   selectHostPlatform(platformArduino);
+  // An empty model file beside the program: a model that configures nothing.
+  testing_support::CTempDir dir;
+  std::ofstream(dir.file("my robot.txt")).flush();
   CHostRobotConfiguration rec;
   CString sError;
-  EXPECT_TRUE(parseLine(rec, L"#pragma config(UserModel, \"C:/robots/my robot.txt\")", sError));
-  EXPECT_EQ(rec.getModelNameUserFile(), L"C:/robots/my robot.txt");
+  EXPECT_TRUE(rec.bParseConfigDefinitionLine(tokenize(L"#pragma config(UserModel, \"my robot.txt\")"), false,
+                                             TLineNumber(3, 0), CString::fromUtf8(dir.file("program.c")), sError))
+      << sError.str();
+  EXPECT_EQ(rec.getModelNameUserFile(), L"my robot.txt");
   EXPECT_TRUE(parseLine(rec, L"#pragma config(DatalogSeries, 0, speed)", sError));
   rec.setCpuClockSpeed(8000000);
   bool bWritten = false;
   EXPECT_EQ(generate(rec, bWritten),
-            L"#pragma config(UserModel, \"C:/robots/my robot.txt\")\r\n" + kCommentLine + L"\r\n");
+            L"#pragma config(UserModel, \"my robot.txt\")\r\n" + kCommentLine + L"\r\n");
   EXPECT_TRUE(bWritten);
 }
 

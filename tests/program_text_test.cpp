@@ -75,7 +75,7 @@ TEST(ProgramText, ReadsEveryConfigurationLineAndReportsRefusedOnes) {
       "int x;\n"
       "  #pragma config(Foo, 1)\r\n"
       "#pragma config(UserModel, \"\")\n"
-      "#pragma config(NetworkNode, 1, robot)\n"
+      "#pragma config(NetworkDefinition, net, robot, ntwkBogus)\n"
       "#pragma config()\n"
       "#pragma Config(DatalogSeries, 1, battery)");
   const std::vector<TConfigurationDiagnostic> diagnostics = readProgramConfiguration(config, program);
@@ -85,7 +85,7 @@ TEST(ProgramText, ReadsEveryConfigurationLineAndReportsRefusedOnes) {
   EXPECT_EQ(diagnostics[1].nLine, 5);
   EXPECT_EQ(diagnostics[1].sMessage.str(), L"Missing user model file name");
   EXPECT_EQ(diagnostics[2].nLine, 6);
-  EXPECT_EQ(diagnostics[2].sMessage.str(), L"Configuration keyword 'NetworkNode' is not supported yet");
+  EXPECT_EQ(diagnostics[2].sMessage.str(), L"Invalid multi-robot network type 'ntwkBogus'");
   // Lines after refused ones are still read.
   ASSERT_EQ(config.getDatalogSeries().size(), 2u);
   EXPECT_EQ(config.getDatalogSeries()[1][1].str(), L"battery");
@@ -189,6 +189,40 @@ TEST(ProgramText, ByteOrderMarkBelongsToNoLineAndIsKept) {
   EXPECT_EQ(text.lineText(0), "#pragma config(UserModel, \"m\")");
   EXPECT_EQ(replaced(kBom + "#pragma config(UserModel, \"old\")\nint x;\n"), kBom + kBlock + "int x;\n");
   EXPECT_EQ(replaced(kBom + "int x;\n"), kBom + kBlock + "int x;\n");
+}
+
+}  // namespace
+
+namespace {
+
+TEST(ProgramText, LinesHoldingMoreThanTheTokensKeepAreRefused) {
+  CHostSelectionScope scope;
+  selectHostPlatform(platformArduino);
+  TTokenizedConfigParms parms;
+  bool bCut = true;
+  CRobotConfigurationBasic::nTokenizeLineReportingCuts(L"#pragma config(DatalogSeries, a, b)", parms, bCut);
+  EXPECT_FALSE(bCut);
+  // Exactly twelve parameters, then the closing parenthesis: nothing dropped.
+  CRobotConfigurationBasic::nTokenizeLineReportingCuts(
+      L"#pragma config(DatalogSeries, 1, 2, 3, 4, 5, 6, 7, 8, 9, 10, 11, 12) // end", parms, bCut);
+  EXPECT_FALSE(bCut);
+  CRobotConfigurationBasic::nTokenizeLineReportingCuts(
+      L"#pragma config(DatalogSeries, 1, 2, 3, 4, 5, 6, 7, 8, 9, 10, 11, 12, 13)", parms, bCut);
+  EXPECT_TRUE(bCut);
+  const std::wstring sLong(100, L'x');
+  CRobotConfigurationBasic::nTokenizeLineReportingCuts(CString(L"#pragma config(DatalogSeries, ") + sLong + L")",
+                                                        parms, bCut);
+  EXPECT_TRUE(bCut);
+  CRobotConfigurationBasic::nTokenizeLineReportingCuts(CString(L"int ") + sLong + L";", parms, bCut);
+  EXPECT_FALSE(bCut);  // only configuration lines count
+
+  CHostRobotConfiguration config;
+  const std::string sProgram = "#pragma config(DatalogSeries, " + std::string(120, 'y') + ")\n";
+  const auto diagnostics = readProgramConfiguration(config, CProgramText(sProgram));
+  ASSERT_EQ(diagnostics.size(), 1u);
+  EXPECT_EQ(diagnostics[0].nLine, 1);
+  EXPECT_EQ(diagnostics[0].sMessage, L"'DatalogSeries' configuration line holds more than is kept (at most 12 "
+                                     L"parameters of 99 characters)");
 }
 
 }  // namespace

@@ -1,0 +1,43 @@
+#include "cli/ReadProgram.h"
+
+#include <cstdio>
+#include <utility>
+
+#include "host/FileIO.h"
+
+CWarningPrinter::CWarningPrinter(std::string sFile)
+    : m_sFile(std::move(sFile)), m_pPrevious(setHostMessageSink(this)) {}
+
+CWarningPrinter::~CWarningPrinter() { setHostMessageSink(m_pPrevious); }
+
+int CWarningPrinter::showMessage(const THostMessage &message) {
+  // A message box's paragraphs become one line, as compilers print them.
+  CString sText(message.sText);
+  sText.Replace(L"\n \n", L" ");
+  sText.Replace(L'\n', L' ');
+  std::fprintf(stderr, "%s: warning: %s\n", m_sFile.c_str(), sText.toUtf8().c_str());
+  return 0;
+}
+
+std::string displayName(const std::string &sPath) { return sPath == "-" ? "<stdin>" : sPath; }
+
+bool readProgram(const std::string &sPath, TReadProgram &program) {
+  std::string sBytes, sError;
+  if (!readProgramFile(sPath, sBytes, sError)) {
+    std::fprintf(stderr, "robotcfg: %s\n", sError.c_str());
+    return false;
+  }
+  program.pText = std::make_unique<CProgramText>(std::move(sBytes));
+  program.pConfig = std::make_unique<CHostRobotConfiguration>();
+  program.pConfig->setPathName(CString::fromUtf8(sPath));
+  CWarningPrinter warnings(displayName(sPath));
+  program.diagnostics = readProgramConfiguration(*program.pConfig, *program.pText);
+  return true;
+}
+
+bool reportDiagnostics(const std::string &sPath, const TReadProgram &program) {
+  for (const TConfigurationDiagnostic &diagnostic : program.diagnostics)
+    std::fprintf(stderr, "%s:%d: error: %s\n", displayName(sPath).c_str(), diagnostic.nLine,
+                 diagnostic.sMessage.toUtf8().c_str());
+  return !program.diagnostics.empty();
+}

@@ -1,0 +1,44 @@
+// Reading programs for the commands: the program's text, its configuration,
+// the lines the configuration refused, and warnings printed as the tool's own.
+#pragma once
+
+#include <memory>
+#include <string>
+#include <vector>
+
+#include "host/HostConfiguration.h"
+#include "host/HostMessages.h"
+#include "host/ProgramText.h"
+
+/// Prints the library's messages as warnings of the file being read, while it lives.
+class CWarningPrinter : public CHostMessageSink {
+ public:
+  explicit CWarningPrinter(std::string sFile);
+  ~CWarningPrinter() override;
+  CWarningPrinter(const CWarningPrinter &) = delete;
+  CWarningPrinter &operator=(const CWarningPrinter &) = delete;
+
+  /// Prints the message on one line; never silences later warnings.
+  int showMessage(const THostMessage &message) override;
+
+ private:
+  std::string m_sFile;
+  CHostMessageSink *m_pPrevious;
+};
+
+/// The name a path is reported under ("<stdin>" for "-").
+std::string displayName(const std::string &sPath);
+
+/// One program read into a configuration.
+struct TReadProgram {
+  std::unique_ptr<CProgramText> pText;
+  std::unique_ptr<CHostRobotConfiguration> pConfig;
+  std::vector<TConfigurationDiagnostic> diagnostics;
+};
+
+/// Reads a program and its configuration; false (after printing why) when the
+/// file cannot be read.
+bool readProgram(const std::string &sPath, TReadProgram &program);
+
+/// Prints the refused lines as FILE:LINE: error: MESSAGE; true when there were any.
+bool reportDiagnostics(const std::string &sPath, const TReadProgram &program);

@@ -1,0 +1,119 @@
+// Program types by platform, and the ProgramType and FirmwareFeatures lines.
+#include <gtest/gtest.h>
+
+#include <string>
+#include <vector>
+
+#include "drive_serial_network/ProgramTypes.h"
+#include "host/DeviceCatalog.h"
+#include "host/HostConfiguration.h"
+#include "host/Platform.h"
+
+namespace {
+
+class ProgramTypeAndFirmware : public ::testing::Test {
+ protected:
+  CHostSelectionScope scope;
+};
+
+bool parseLine(CRobotConfigurationBasic &rec, const std::wstring &sLine, CString &sError) {
+  TTokenizedConfigParms parms;
+  EXPECT_EQ(CRobotConfigurationBasic::nTokenizeLine(sLine, parms), lineTypeConfigPragma) << sLine;
+  return rec.bParseConfigDefinitionLine(parms, false, TLineNumber(1, 0), L"program.c", sError);
+}
+
+// The generated lines that start with `sPrefix`.
+std::vector<std::wstring> generatedLines(CRobotConfigurationBasic &rec, const std::wstring &sPrefix) {
+  CString sText;
+  rec.buildSourceCodeForConfiguration(sText, false);
+  std::vector<std::wstring> lines;
+  const std::wstring &s = sText.str();
+  for (size_t pos = 0; pos < s.size();) {
+    size_t end = s.find(L"\r\n", pos);
+    if (end == std::wstring::npos) end = s.size();
+    if (s.compare(pos, sPrefix.size(), sPrefix) == 0) lines.push_back(s.substr(pos, end - pos));
+    pos = end + 2;
+  }
+  return lines;
+}
+
+TEST_F(ProgramTypeAndFirmware, ProgramTypeWordsDependOnThePlatform) {
+  struct TCase {
+    int nKind;
+    const wchar_t *pzWord;
+    int nValue;  // -1: refused on that platform
+  } kCases[] = {
+      {platformVexPic, L"CompetitionUserControl", 5},  {platformVexI2c, L"CompetitionUserControl", 3},
+      {platformArduino, L"CompetitionUserControl", 3}, {platformSharedPorts, L"CompetitionUserControl", -1},
+      {platformVexPic, L"StandaloneWithUSBCable", 2},  {platformVexPic, L"StandaloneWiFi", -1},
+      {platformVexI2c, L"StandaloneWiFi", 1},          {platformKind9, L"Competition", 3},
+      {platformKind9, L"NonCompetition", 1},           {platformNxt, L"Competition", -1},
+      {platformVexPic, L"competition", -1},            {platformVexI2c, L"NotYetAssigned", 255},
+  };
+  for (const TCase &test : kCases) {
+    SCOPED_TRACE(testing::Message() << test.nKind << " " << CString(test.pzWord).toUtf8());
+    selectHostPlatform(test.nKind);
+    CHostRobotConfiguration rec;
+    CString sError;
+    const std::wstring sLine = std::wstring(L"#pragma config(ProgramType, ") + test.pzWord + L")";
+    EXPECT_EQ(parseLine(rec, sLine, sError), test.nValue >= 0);
+    EXPECT_EQ(rec.getSettings().nProgramType, test.nValue);
+    if (test.nValue < 0) {
+      EXPECT_EQ(sError, std::wstring(L"'") + test.pzWord + L"' is an invalid program type for current platform");
+    }
+  }
+
+  // Every value the VEX PIC writes has a word that reads back to it; the labels are the menu's.
+  selectHostPlatform(platformVexPic);
+  EXPECT_EQ(std::wstring(nProgramTypes[2].pzLabel), L"Standalonevia USB Cable");
+  EXPECT_EQ(std::wstring(nProgramTypes[9].pzLabel), L"Standalone");
+  for (int nValue : {1, 2, 3, 4}) {
+    const std::wstring sWord = getTypedefEnumString(nProgramTypes, nValue, -1);
+    EXPECT_EQ(getTypedefIndex(nProgramTypes, sWord, true), nValue) << nValue;
+  }
+}
+
+TEST_F(ProgramTypeAndFirmware, RefusedProgramTypeIsNeverWritten) {
+  selectHostPlatform(platformVexPic);
+  CHostRobotConfiguration rec;
+  EXPECT_TRUE(generatedLines(rec, L"#pragma config(ProgramType").empty());  // 255 after a clear
+  CString sError;
+  EXPECT_FALSE(parseLine(rec, L"#pragma config(ProgramType, Scrimmage)", sError));
+  EXPECT_EQ(sError, L"'Scrimmage' is an invalid program type for current platform");
+  EXPECT_EQ(rec.getSettings().nProgramType, -1);
+  EXPECT_TRUE(generatedLines(rec, L"#pragma config(ProgramType").empty());
+  EXPECT_FALSE(parseLine(rec, L"#pragma config(ProgramType)", sError));
+  EXPECT_EQ(sError, L"'' is an invalid program type for current platform");
+}
+
+TEST_F(ProgramTypeAndFirmware, FirmwareFeatures) {
+  selectHostPlatform(platformVexI2c);
+  CHostRobotConfiguration rec;
+  EXPECT_TRUE(generatedLines(rec, L"#pragma config(FirmwareFeatures").empty());
+
+  CString sError;
+  EXPECT_TRUE(parseLine(rec, L"#pragma config(FirmwareFeatures, fwSounds)", sError));
+  EXPECT_FALSE(rec.getSettings().bFwTimedServo);
+  EXPECT_TRUE(rec.getSettings().bFwSounds);
+  EXPECT_EQ(generatedLines(rec, L"#pragma config(FirmwareFeatures"),
+            (std::vector<std::wstring>{L"#pragma config(FirmwareFeatures, fwSounds)"}));
+
+  // A bad word fails the line; the good ones around it are still taken.
+  rec.clearConfigurationDefinition();
+  EXPECT_FALSE(parseLine(rec, L"#pragma config(FirmwareFeatures, fwsounds, fwTimedServo)", sError));
+  EXPECT_EQ(sError, L"Invalid firmware feature 'fwsounds'.");
+  EXPECT_TRUE(rec.getSettings().bFwTimedServo);
+  EXPECT_FALSE(rec.getSettings().bFwSounds);
+  EXPECT_FALSE(parseLine(rec, L"#pragma config(FirmwareFeatures, Sounds, fwSounds, , x)", sError));
+  EXPECT_EQ(sError, L"Invalid firmware feature 'x'.");  // the last bad word's message
+  EXPECT_EQ(generatedLines(rec, L"#pragma config(FirmwareFeatures"),
+            (std::vector<std::wstring>{L"#pragma config(FirmwareFeatures, fwTimedServo, fwSounds)"}));
+
+  // Reading never takes a feature away.
+  EXPECT_TRUE(parseLine(rec, L"#pragma config(FirmwareFeatures)", sError));
+  EXPECT_TRUE(parseLine(rec, L"#pragma config(FirmwareFeatures, fwSounds)", sError));
+  EXPECT_TRUE(rec.getSettings().bFwTimedServo);
+  EXPECT_TRUE(rec.getSettings().bFwSounds);
+}
+
+}  // namespace
