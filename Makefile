@@ -6,7 +6,7 @@ GENERATOR := $(shell command -v ninja >/dev/null 2>&1 && echo "-G Ninja")
 JOBS ?= $(shell nproc 2>/dev/null || echo 2)
 ROBOTCFG = ./$(BUILD_DIR)/robotcfg
 
-.PHONY: all build demo test asan-test ci clean deps goldens
+.PHONY: all build demo test asan-test ci clean deps goldens coverage fuzz
 
 all: build
 
@@ -38,6 +38,35 @@ asan-test:
 	@$(CMAKE) -S . -B $(ASAN_BUILD_DIR) $(GENERATOR) -DCMAKE_BUILD_TYPE=Debug -DROBOTCONFIG_SANITIZE=ON -DROBOTCONFIG_WERROR=ON $(CMAKE_ARGS) >/dev/null
 	$(CMAKE) --build $(ASAN_BUILD_DIR) -j $(JOBS)
 	cd $(ASAN_BUILD_DIR) && ctest --output-on-failure -j $(JOBS)
+
+# Line and branch coverage of the library from the test suite (gcovr).
+COVERAGE_BUILD_DIR ?= build-coverage
+coverage:
+	@command -v gcovr >/dev/null 2>&1 || ./.ci/install-deps coverage
+	@$(CMAKE) -S . -B $(COVERAGE_BUILD_DIR) $(GENERATOR) -DCMAKE_BUILD_TYPE=Debug -DROBOTCONFIG_COVERAGE=ON $(CMAKE_ARGS) >/dev/null
+	$(CMAKE) --build $(COVERAGE_BUILD_DIR) -j $(JOBS)
+	find $(COVERAGE_BUILD_DIR) -name '*.gcda' -delete
+	cd $(COVERAGE_BUILD_DIR) && ctest -j $(JOBS) >/dev/null
+	gcovr --root . --object-directory $(COVERAGE_BUILD_DIR) --filter 'core/' --filter 'motors/' --filter 'sensors/' \
+	  --filter 'drive_serial_network/' --filter 'host/' --exclude-unreachable-branches --exclude-throw-branches \
+	  --print-summary --txt $(COVERAGE_BUILD_DIR)/coverage.txt
+
+# Runs every fuzz harness for FUZZ_SECONDS each (clang with libFuzzer and the sanitizers).
+FUZZ_BUILD_DIR ?= build-fuzz
+FUZZ_SECONDS ?= 60
+fuzz:
+	@$(CMAKE) -S . -B $(FUZZ_BUILD_DIR) $(GENERATOR) -DCMAKE_CXX_COMPILER=clang++ -DROBOTCONFIG_SANITIZE=ON \
+	  -DROBOTCONFIG_BUILD_FUZZERS=ON -DROBOTCONFIG_BUILD_TESTS=OFF >/dev/null
+	$(CMAKE) --build $(FUZZ_BUILD_DIR) -j $(JOBS)
+	@set -e; for harness in fuzz/fuzz_*.cpp; do \
+	  name=$$(basename $$harness .cpp); \
+	  work=$(FUZZ_BUILD_DIR)/corpus/$$name; mkdir -p $$work; \
+	  echo "== $$name for $(FUZZ_SECONDS) s"; \
+	  $(FUZZ_BUILD_DIR)/fuzz/$$name -max_total_time=$(FUZZ_SECONDS) -max_len=4096 -print_final_stats=1 \
+	    -artifact_prefix=$(FUZZ_BUILD_DIR)/$$name- $$work fuzz/corpus/$$name 2>&1 | \
+	    grep -E '^(stat::number_of_executed_units|stat::average_exec_per_sec|==[0-9]+==|SUMMARY|Done)' || true; \
+	  if ls $(FUZZ_BUILD_DIR)/$$name-* >/dev/null 2>&1; then echo "$$name found a failing input"; exit 1; fi; \
+	done
 
 ci:
 	./.ci/run

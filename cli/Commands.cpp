@@ -19,6 +19,8 @@ void writeStdout(const std::string &sBytes) { std::fwrite(sBytes.data(), 1, sByt
 
 // readProgram, noting on standard error when the program's board made the IDE switch boards.
 bool readProgramNotingBoard(const std::string &sPath, TReadProgram &program) {
+  // Every file starts from the command line's board, whatever board an earlier one named.
+  CHostSelectionScope scope;
   const TControllerBoardType nBoardBefore = pToggles->getIDECircuitBoardType();
   if (!readProgram(sPath, program)) return false;
   const TControllerBoardType nBoard = pToggles->getIDECircuitBoardType();

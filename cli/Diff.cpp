@@ -142,8 +142,8 @@ CString describeServo(const CRobotConfigurationBasic &config, int nServo) {
   CString sType(getServoTypedefString(nType));
   if (sType.IsEmpty()) sType.Format(L"type %d", nType);
   CString sText;
-  sText.Format(L"%-14s %-30s setting %d", orDash(config.sServoNames[size_t(nServo)]), nType == 0 ? CString(L"-") : sType,
-               config.getSettings().nServoSettings[size_t(nServo)]);
+  sText.Format(L"%-14s %-30s setting %d", orDash(config.sServoNames[size_t(nServo)]),
+               nType == 0 ? CString(L"-") : sType, config.getSettings().nServoSettings[size_t(nServo)]);
   return sText;
 }
 
@@ -212,8 +212,9 @@ void compareBoards(const CRobotConfigurationBasic &a, const CRobotConfigurationB
   auto describeBoard = [](const CRobotConfigurationBasic &config) {
     const auto &plugins = config.getSettings().nPluginBoardTypes;
     CString sText;
-    sText.Format(L"%s (%d), CPU clock %d, plug-in boards %d, %d, %d", orDash(getCktBoardNameString(config.getCircuitBoardType())),
-                 config.getCircuitBoardType(), config.getCpuClockSpeed(), plugins[0], plugins[1], plugins[2]);
+    const TControllerBoardType nBoard = config.getCircuitBoardType();
+    sText.Format(L"%s (%d), CPU clock %d, plug-in boards %d, %d, %d", orDash(getCktBoardNameString(nBoard)), nBoard,
+                 config.getCpuClockSpeed(), plugins[0], plugins[1], plugins[2]);
     return sText;
   };
   list.add(L"board", describeBoard(a), describeBoard(b));

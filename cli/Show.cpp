@@ -40,6 +40,7 @@ void printMotors(CRobotConfigurationBasic &config, std::string &sOut) {
     if (!config.bIsValidMotorPort(n)) continue;
     config.getDefaultMotorNameForPlatformOrControllerBoard(n, sPort);
     config.getUserDefinedMotorNameInConfig(n, sName);
+    if (sName.IsEmpty()) config.getDefaultMotorName(n, sName);  // what the program may call it
     const TMotorSlot &motor = config.getSettings().motors[size_t(n)];
     CString sPins;
     if (motor.nPrimaryIOPin >= 0 || motor.nSecondaryIOPin >= 0)

@@ -179,8 +179,8 @@ bool CRobotConfigurationBasic::buildSourceCodeForSerialPorts() {
     if (!pzPort || !*pzPort) continue;
     getMapUARTPortToIOPins(port, nFirstPin, nSecondPin);
     sLine.Format(L"#pragma config(%s, %s, %s, %s%s)", TConfigTypeDefns::getConfigTypeName(configTypeUartUsage),
-                 pzPort, getTypedefEnumString(nUARTTypes, nMode, -1), getTypedefEnumString(nUARTBaudRates, nBaudRate, -1),
-                 pinSuffix(nFirstPin, nSecondPin, nBoard));
+                 pzPort, getTypedefEnumString(nUARTTypes, nMode, -1),
+                 getTypedefEnumString(nUARTBaudRates, nBaudRate, -1), pinSuffix(nFirstPin, nSecondPin, nBoard));
     addSourceLineToConfiguration(sLine);
     bWritten = true;
   }

@@ -9,7 +9,7 @@ constexpr uint32_t kVexPic = 0x4;
 constexpr uint32_t kVexI2c = 0x8;
 constexpr uint32_t kArduino = 0x10;
 
-// A row: platform mask, second field, value, keyword, label, row attribute.
+// A row: platform mask, value, keyword, label, row attribute, and the field after the mask.
 constexpr TDeviceTypeMenuItem row(uint32_t nMask, int32_t nValue, const wchar_t *pzKeyword, const wchar_t *pzLabel,
                                   int32_t nRowAttribute = 0, int32_t nSecondField = 0) {
   return {nMask, nSecondField, 0, 0, 0, 0xFE, nRowAttribute, nValue, pzKeyword, pzLabel, 0};

@@ -8,18 +8,26 @@
 #include "host/HostMessages.h"
 #include "host/Platform.h"
 
-/// Selects a platform kind, toggle and board from the input's first byte and
-/// removes that byte; message boxes are captured, never printed.
+/// Selects the platform kind and toggle 1 from the input's first byte and
+/// the IDE board from the second (the platform's own board for values past
+/// the catalog's boards), and removes those bytes.
 inline void selectPlatformFromInput(const uint8_t *&data, size_t &size) {
   int nKind = platformNxt;
   bool bExternal = false;
+  TControllerBoardType nBoard = -1;
   if (size > 0) {
     nKind = data[0] % kNumbOfPlatformKinds;
     bExternal = (data[0] & 0x80) != 0;
     ++data;
     --size;
   }
-  selectHostPlatform(nKind, -1, bExternal);
+  if (size > 0) {
+    // Most inputs keep the platform's own board; some try any board of the catalog.
+    if (data[0] < 74) nBoard = data[0] % 37;
+    ++data;
+    --size;
+  }
+  selectHostPlatform(nKind, nBoard, bExternal);
 }
 
 /// Stops the run when an invariant does not hold.

@@ -1,5 +1,6 @@
-// Reads arbitrary configuration lines on every platform and checks that what
-// the record writes back reads again without error and writes the same text.
+// The reading road followed by generation: arbitrary configuration lines on
+// any platform, board and toggle; what the record writes back must read again
+// without error, write the same text, and give an equal record.
 #include <string_view>
 
 #include "core/RobotConfiguration.h"
@@ -25,7 +26,10 @@ extern "C" int LLVMFuzzerTestOneInput(const uint8_t *data, size_t size) {
   }
   CHostRobotConfiguration config;
   const CProgramText program(sProgram);
-  if (!readProgramConfiguration(config, program).empty()) return 0;
+  const std::vector<TConfigurationDiagnostic> diagnostics = readProgramConfiguration(config, program);
+  for (const TConfigurationDiagnostic &diagnostic : diagnostics)
+    fuzzCheck(!diagnostic.sMessage.IsEmpty(), "a rejected line comes with a message");
+  if (!diagnostics.empty()) return 0;
   CString sFirst;
   config.buildSourceCodeForConfiguration(sFirst, false);
   CHostRobotConfiguration reread;
@@ -34,5 +38,9 @@ extern "C" int LLVMFuzzerTestOneInput(const uint8_t *data, size_t size) {
   CString sSecond;
   reread.buildSourceCodeForConfiguration(sSecond, false);
   fuzzCheck(sFirst == sSecond, "generation is a fixed point");
+  // The record the generated block gives is the record it was generated from.
+  CString sThird;
+  config.buildSourceCodeForConfiguration(sThird, false);  // writing may normalise the first record
+  fuzzCheck(config.compareConfiguration(reread) == configCompareSame, "read-back record compares equal");
   return 0;
 }

@@ -10,7 +10,8 @@ class CStderrMessageSink : public CHostMessageSink {
  public:
   int showMessage(const THostMessage &message) override {
     std::fprintf(stderr, "warning: %s\n", message.sText.toUtf8().c_str());
-    return 1;
+    // Nobody is asked, so nobody chose to silence later warnings.
+    return message.bNeverRepeatPrompt ? 0 : 1;
   }
 };
 

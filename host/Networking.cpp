@@ -58,14 +58,9 @@ void CNtwkInfoFromPragmas::getPrimaryNode(unsigned char (&address)[8]) const {
 }
 
 bool CNtwkInfoFromPragmas::operator==(const CNtwkInfoFromPragmas &o) const {
-  if (bDefined != o.bDefined || sNetworkName != o.sNetworkName || nChannel != o.nChannel ||
-      nNetworkType != o.nNetworkType || date.nDate != o.date.nDate || date.nTime != o.date.nTime ||
-      definitionLine != o.definitionLine || nNumbOfNodes != o.nNumbOfNodes || nNetworkNumber != o.nNetworkNumber ||
-      nPrimaryNodeAddress != o.nPrimaryNodeAddress)
-    return false;
-  for (int i = 0; i < nNumbOfNodes && i < kMaxNodesInNetwork; ++i)
-    if (!(nodes[size_t(i)] == o.nodes[size_t(i)])) return false;
-  return true;
+  return bDefined == o.bDefined && sNetworkName == o.sNetworkName && nChannel == o.nChannel &&
+         nNetworkType == o.nNetworkType && date.nDate == o.date.nDate && date.nTime == o.date.nTime &&
+         nNetworkNumber == o.nNetworkNumber && nPrimaryNodeAddress == o.nPrimaryNodeAddress;
 }
 
 }  // namespace Networking

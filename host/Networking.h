@@ -48,6 +48,10 @@ class CNtwkInfoFromPragmas {
   void setPrimaryNodeAddress(const TNodeSerialNumber &address) { nPrimaryNodeAddress = address; }
   void getPrimaryNode(TNodeSerialNumber &address) const { address = nPrimaryNodeAddress; }
 
+  /// The same network definition: name, type, number, channel, date and
+  /// primary node. The node entries and the line numbers record the program's
+  /// lines, not settings: the node lines written come from the radio-node
+  /// registry, and the same network on other lines is the same network.
   bool operator==(const CNtwkInfoFromPragmas &o) const;
   bool operator!=(const CNtwkInfoFromPragmas &o) const { return !(*this == o); }
 

@@ -1,5 +1,6 @@
 #include <algorithm>
 #include <array>
+#include <string_view>
 
 #include "core/RobotConfiguration.h"
 #include "host/DeviceCatalog.h"
@@ -107,6 +108,18 @@ const wchar_t *hubWordOfValue(TSensorPortHub nHub) {
   return (nHub >= 0 && nHub < kNumbOfHubTypes && pzMuxTypes[nHub]) ? pzMuxTypes[nHub] : getMuxTypes(-1);
 }
 
+// Characters that end an unquoted parameter of a configuration line.
+constexpr std::wstring_view kParameterBreaks = L" \t,()";
+
+// A name as a line must carry it to be read back whole: between double quotes
+// when it holds a character that would end the parameter. A name with a double
+// quote of its own cannot be quoted and is written as it is.
+CString nameAsParameter(const CString &sName) {
+  const std::wstring &s = sName.str();
+  if (s.find_first_of(kParameterBreaks) == std::wstring::npos || sName.Find(L'"') >= 0) return sName;
+  return CString(L'"') + sName + L'"';
+}
+
 }  // namespace
 
 int getNumbOfMotorIndexesToWrite() {
@@ -144,9 +157,13 @@ bool CRobotConfigurationBasic::bParseConfigDefinitionLineMotor(const TTokenizedC
   motor.bReversed = false;
   setMotorIOPinsInConfig(nMotor, -1, -1, false);
 
-  TMotorTypes nType = getMotorTypedefNameIndex(parms.sParms[3], getAorDMotorTypeMask(nMotor));
+  const TSensorHWTypesMask nHardwareMask = getAorDMotorTypeMask(nMotor);
+  TMotorTypes nType = getMotorTypedefNameIndex(parms.sParms[3], nHardwareMask);
   if (nType == kMotorTypeLegacyNormal) nType = getDefaultMotorType(nMotor);
   nType = resolveMotorTypeForPlatform(nType);
+  // A replacement type the port's hardware cannot drive has no name on this
+  // port, so no line could carry it: the port has no motor.
+  if (nType != 0 && CString(getMotorTypedefString(nType, nHardwareMask)).IsEmpty()) nType = 0;
   motor.nMotorType = nType;
 
   if (pToggles->getPlatformKind() == platformSharedPorts && nType != 0 &&
@@ -295,7 +312,7 @@ bool CRobotConfigurationBasic::buildSourceCodeForMotors() {
     CString sPortColumn;
     getDefaultMotorNameForPlatformOrControllerBoard(nMotor, sPortColumn);
     sPortColumn += L",";
-    CString sNameColumn = sName == sDefaultName ? CString(kDefaultNameColumn) : sName + L",";
+    CString sNameColumn = sName == sDefaultName ? CString(kDefaultNameColumn) : nameAsParameter(sName) + L",";
     if (platform.bFirstMotorCanBeAudio && nMotor == 0 && nType == kMotorTypeSpeaker) sNameColumn = kAudioNameColumn;
     const TMotorIOPinsDefinition *pPins = getMotorIOPin(nMotor);
     const CString sType = getMotorTypedefString(nType, pPins ? pPins->nHWTypesMask : 0);
@@ -361,7 +378,7 @@ void CRobotConfigurationBasic::buildSourceCodeForRenameMotor(int nMotor) {
   getDefaultMotorNameForPlatformOrControllerBoard(nMotor, sPort);
   CString sLine;
   sLine.Format(L"#pragma config(%s, %s, %s)", TConfigTypeDefns::getConfigTypeName(configTypeRenameMotor), sPort,
-               sMotorNames[size_t(nMotor)]);
+               nameAsParameter(sMotorNames[size_t(nMotor)]));
   addSourceLineToConfiguration(sLine);
 }
 

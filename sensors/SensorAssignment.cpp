@@ -37,6 +37,7 @@ constexpr std::array<TSensorTypes, 2> kI2CBusSensors = {kSensorI2CEncoder, kSens
 // Hub types that carry motors or servos, and so make their sensor port a hub port.
 constexpr std::array<TSensorPortHub, 3> kControllerHubs = {hubHTMotor, hubHTServo, hubMatrxRbtcs};
 
+// True when `value` is one of `values`.
 template <class T, size_t N>
 bool bIsOneOf(const std::array<T, N> &values, T value) {
   return std::find(values.begin(), values.end(), value) != values.end();

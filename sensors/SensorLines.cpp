@@ -1,5 +1,6 @@
 #include <algorithm>
 #include <array>
+#include <initializer_list>
 
 #include "core/RobotConfiguration.h"
 #include "host/DeviceCatalog.h"
@@ -23,9 +24,10 @@ constexpr std::array<TSensorTypes, 3> kTypesWithoutSensor = {0, 56, 81};
 constexpr const wchar_t *kAutoAssign = L"AutoAssign";
 constexpr const wchar_t *kClosingParenthesis = L")";
 
-// Parameter positions after the type: the secondary-port column and the I2C column.
+// The parameter after the type: the mode, or the column that moves up in its place.
 constexpr int kFirstColumnAfterType = 4;
 
+// True when `value` is one of `values`.
 template <class T, size_t N>
 bool bIsOneOf(const std::array<T, N> &values, T value) {
   return std::find(values.begin(), values.end(), value) != values.end();
@@ -94,7 +96,7 @@ bool CRobotConfigurationBasic::bParseConfigDefinitionLineSensor(const TTokenized
   } else if (sFourth.IsEmpty()) {
     // The writer leaves the fourth parameter empty for a sensor without a
     // secondary port whose I2C column follows: the address is then the fifth
-    // parameter, which no secondary-port keyword can be.
+    // parameter, which as a secondary port reads as none.
     const CString &sSixth = parameter(parms, kFirstColumnAfterType + 2);
     if (bIsI2CColumnOnly(parameter(parms, kFirstColumnAfterType + 1)) &&
         (sSixth.IsEmpty() || bIsModeOfType(nType, sSixth)))

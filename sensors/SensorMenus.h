@@ -3,9 +3,9 @@
 // default mode of a sensor type.
 #pragma once
 
+#include "host/DeviceCatalog.h"
 #include "host/DeviceTypes.h"
 
-struct TDeviceTypeMenuItem;
 class CRobotConfigurationBasic;
 class CDropDownButtonOfDeviceTypeMenuItem;
 

@@ -8,22 +8,14 @@ namespace {
 
 // Position of a SrvoPosition line that leaves a position empty.
 constexpr uint8_t kEmptyServoPosition = 128;
-// Largest value a servo position can hold.
-constexpr int kMaxServoPosition = 255;
 // Parameter of a SrvoPosition line that holds the first position (the name is parameter 1).
 constexpr int kFirstServoPositionParm = 2;
 
-// Reads one servo position; false when the text is neither empty nor a number 0..255.
-bool bReadServoPosition(const CString &sText, uint8_t &nPosition) {
-  if (sText.IsEmpty()) {
-    nPosition = kEmptyServoPosition;
-    return true;
-  }
+// One servo position as a line gives it: 128 when left empty, else the number's low 8 bits.
+uint8_t servoPositionOf(const CString &sText) {
+  if (sText.IsEmpty()) return kEmptyServoPosition;
   bool bOk = false;
-  const int nValue = getInteger(sText, bOk);
-  if (!bOk || nValue < 0 || nValue > kMaxServoPosition) return false;
-  nPosition = static_cast<uint8_t>(nValue);
-  return true;
+  return static_cast<uint8_t>(getInteger(sText, bOk));
 }
 
 }  // namespace
@@ -34,16 +26,6 @@ bool CRobotConfigurationBasic::bParseConfigDefinitionLineServo(const TTokenizedC
   const int nServo = getServoIndex(parms.sParms[1]);
   if (!bIsServoIndex(nServo)) {
     sError.Format(L"Bad servo device index '%s'", parms.sParms[1]);
-    return false;
-  }
-  // The writer only writes servos of the configured controllers; any other
-  // servo, or a type word it cannot spell back, would vanish from the program.
-  if (nServo >= pPlatformData->pPlatformParms->nNumbOfServoPorts || !bIsValidServoPort(nServo)) {
-    sError.Format(L"No servo controller for servo '%s'", parms.sParms[1]);
-    return false;
-  }
-  if (nType < 0) {
-    sError.Format(L"Bad servo type '%s'", parms.sParms[3]);
     return false;
   }
   configureDefaultMotorAndServoNamesForEquippedHubs(false);
@@ -62,25 +44,9 @@ bool CRobotConfigurationBasic::bParseConfigDefinitionLineServoPositions(const TT
     sError = L"Maximum limit of servo position settinge exceeded";
     return false;
   }
-  // A set without a name is never written back.
-  if (parms.sParms[1].IsEmpty()) {
-    sError.Format(L"Bad servo position set name '%s'", parms.sParms[1]);
-    return false;
-  }
   std::array<uint8_t, kNumbOfServoPositionsPerSet> positions{};
-  for (int j = 0; j < kNumbOfServoPositionsPerSet; ++j) {
-    const CString &sPosition = parms.sParms[size_t(kFirstServoPositionParm + j)];
-    if (!bReadServoPosition(sPosition, positions[size_t(j)])) {
-      sError.Format(L"Bad servo position '%s'", sPosition);
-      return false;
-    }
-  }
-  // Positions beyond the eighth have no place in the set.
-  for (int k = kFirstServoPositionParm + kNumbOfServoPositionsPerSet; k < kMaxConfigTokens; ++k)
-    if (!parms.sParms[size_t(k)].IsEmpty()) {
-      sError.Format(L"Bad servo position '%s'", parms.sParms[size_t(k)]);
-      return false;
-    }
+  for (int j = 0; j < kNumbOfServoPositionsPerSet; ++j)
+    positions[size_t(j)] = servoPositionOf(parms.sParms[size_t(kFirstServoPositionParm + j)]);
   sServoPositionNames[size_t(nSet)] = parms.sParms[1];
   settings.nServoPositions[size_t(nSet)] = positions;
   settings.nNumbOfServoPositions = nSet + 1;

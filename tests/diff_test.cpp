@@ -42,8 +42,9 @@ class Diff : public ::testing::Test {
 
 TEST_F(Diff, ResultsAndExitStatuses) {
   const std::string sXBee = program("xbee.c", "#pragma config(UART_Usage, UART1, uartXBeeWiFi, baudRate115200)\n");
-  const std::string sSame = program("same.c", "// the same configuration, written differently\n"
-                                              "#pragma config(uart_usage, UART1, uartXBeeWiFi, baudRate115200, IOPins, x, y)\n");
+  const std::string sSame =
+      program("same.c", "// the same configuration, written differently\n"
+                        "#pragma config(uart_usage, UART1, uartXBeeWiFi, baudRate115200, IOPins, x, y)\n");
   const std::string sUser = program("user.c", "#pragma config(UART_Usage, UART1, uartUserControl, baudRate9600)\n");
 
   TRunResult r = run(kMega, {"diff", sXBee, sSame});
@@ -157,7 +158,8 @@ TEST_F(Diff, EachProgramIsReadForTheBoardOfTheCommandLine) {
 
 TEST_F(Diff, RejectedLinesAndUnreadableFilesAreErrors) {
   const std::string sGood = program("good.c", "#pragma config(UART_Usage, UART1, uartUserControl, baudRate9600)\n");
-  const std::string sBad = program("bad.c", "int x;\n#pragma config(UART_Usage, UART7, uartUserControl, baudRate9600)\n");
+  const std::string sBad =
+      program("bad.c", "int x;\n#pragma config(UART_Usage, UART7, uartUserControl, baudRate9600)\n");
   TRunResult r = run(kMega, {"diff", sGood, sBad});
   EXPECT_EQ(r.nExit, 2);
   EXPECT_EQ(r.sOut, "");

@@ -204,7 +204,8 @@ TEST_F(ConfigurationText, CpuParametersWrittenOnlyWhenNotTheBoardDefault) {
   EXPECT_EQ(generate(copy, bWritten), sText);
 
   readBlock(copy, L"#pragma config(CPU_Parameters, ATmega328P, 8000000)\r\n");
-  EXPECT_EQ(generate(copy, bWritten), L"#pragma config(CircuitBoardType, typeCktBoardFio)\r\n" + kCommentLine + L"\r\n");
+  EXPECT_EQ(generate(copy, bWritten),
+            L"#pragma config(CircuitBoardType, typeCktBoardFio)\r\n" + kCommentLine + L"\r\n");
 
   // The clock line belongs to the board platform alone.
   selectHostPlatform(platformVexPic);

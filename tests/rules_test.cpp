@@ -16,7 +16,8 @@ const std::wstring kDigitalInText =
     L"Use \"Motor and Sensors Setup\" command (on the \"Robot\" menu) to modify configuration.";
 const std::wstring kDigitalOutText =
     L"VEX CPU hardware optimizes placement of digital output ports.\n \n"
-    L"Analog sensor at port 'in6' should be assigned to port lower in number than the digital output at port 'in4'!\n \n"
+    L"Analog sensor at port 'in6' should be assigned to port lower in number than the digital output at port "
+    L"'in4'!\n \n"
     L"Use \"Motor and Sensors Setup\" command (on the \"Robot\" menu) to modify configuration.";
 const std::wstring kQuadText =
     L"VEX CPU hardware optimizes placement of quadrature motor encoders.\n \n"

@@ -164,6 +164,21 @@ TEST_F(SensorLines, ReadingStoresTypeNameModeAndLines) {
   EXPECT_EQ(rec.getI2C_Address(3), 12);
   EXPECT_EQ(rec.getSensorModeInConfig(3), 0);  // a mode of another type is no mode
 
+  // A closing parenthesis in the mode or secondary place: the I2C column follows it.
+  EXPECT_TRUE(parse(L"#pragma config(Sensor, in7, heat, sensorI2CTemperature, ), 44, 0)"));
+  EXPECT_EQ(rec.getI2C_Address(6), 44);
+  EXPECT_EQ(rec.getSecondaryPort(6), -1);
+  EXPECT_TRUE(parse(L"#pragma config(Sensor, in7, heat, sensorI2CTemperature, secondaryPort3, ), 5)"));
+  EXPECT_EQ(rec.getI2C_Address(6), 0);
+  EXPECT_EQ(rec.getSecondaryPort(6), 2);
+
+  // The writer's "AutoAssign" after an empty secondary column resets an address.
+  rec.setI2C_Address(20, 9);
+  EXPECT_TRUE(parse(L"#pragma config(Sensor, I2C_1,  ,               sensorQuadEncoderOnI2CPort,    , AutoAssign )"));
+  EXPECT_EQ(rec.getSensorTypeInConfig(20), 67);
+  EXPECT_EQ(rec.getI2C_Address(20), 0);
+  EXPECT_EQ(rec.getSecondaryPort(20), -1);
+
   // A name given to a port whose reader stores nothing else.
   rec.setSensorModeInConfig(5, 2);
   rec.setSecondaryPort(5, 4);
@@ -347,11 +362,13 @@ TEST_F(SensorLines, EveryTypeOnEveryPortReadsBack) {
       const bool bTwoPorts = bTwoPortGroup && bIn(kTwoPortTypes, nType);
       for (TSensorModes nMode = 0; nMode <= 10; ++nMode) {
         if (*getSensorModeString(nType, nMode) == 0) continue;
-        for (int nParity = 0; nParity < 2; ++nParity) {
+        // A two-port type fills every other port, and the ports between in a second pass.
+        const int nStride = bTwoPorts ? 2 : 1;
+        for (int nFirst = 0; nFirst < nStride; ++nFirst) {
           SCOPED_TRACE(testing::Message() << "kind " << nKind << " type " << nType << " mode " << nMode);
           rec.clearConfigurationDefinition();
           std::vector<int> ports;
-          for (int nPort = nParity; bValidPort(nPort); nPort += 2) {
+          for (int nPort = nFirst; bValidPort(nPort); nPort += nStride) {
             if (bTwoPorts && !bValidPort(nPort + 1)) break;
             ports.push_back(nPort);
             rec.setUserDefinedSensorNameInConfig(nPort, CString(L's') + std::to_wstring(nPort), TLineNumber(1, 0));

@@ -182,71 +182,37 @@ TEST_F(SerialPorts, DefaultUsesAndBaudRates) {
 
 TEST_F(SerialPorts, PinMapsBothWays) {
   select(platformArduino, kMega);
-  EXPECT_EQ(rec.getMaxNumbOfUARTPorts(), 4);
-  EXPECT_EQ(rec.getMaxNumbOfI2CPorts(), 1);
   EXPECT_TRUE(rec.bCanSystemUartPortBeReconfigured());
-  const int kUartPins[4][2] = {{16, 17}, {35, 34}, {33, 32}, {31, 30}};
   int nFirst = 0, nSecond = 0, nPort = 0;
-  for (int port = 0; port < 4; ++port) {
-    rec.getMapUARTPortToIOPins(port, nFirst, nSecond);
-    EXPECT_EQ(nFirst, kUartPins[port][0]);
-    EXPECT_EQ(nSecond, kUartPins[port][1]);
-    const TSerialPortIOPinsDefn *pDefn = rec.getUARTPortIOPinDefinition(port);
-    ASSERT_NE(pDefn, nullptr);
-    EXPECT_EQ(pDefn, &getCircuitBoardInfo(kMega)->pSerialPorts->uartPins[size_t(port)]);
-    for (const int nPin : kUartPins[port]) {
-      EXPECT_TRUE(rec.findUartFromPin(nPin, nPort, nFirst, nSecond));
-      EXPECT_EQ(nPort, port);
-      EXPECT_EQ(nFirst, kUartPins[port][0]);
-      EXPECT_EQ(nSecond, kUartPins[port][1]);
-    }
-  }
-  for (const int port : {-1, 4, 6, 100}) {
-    rec.getMapUARTPortToIOPins(port, nFirst, nSecond);
-    EXPECT_EQ(nFirst, -1);
-    EXPECT_EQ(nSecond, -1);
-    EXPECT_EQ(rec.getUARTPortIOPinDefinition(port), nullptr);
-  }
+  EXPECT_EQ(rec.getUARTPortIOPinDefinition(1), &getCircuitBoardInfo(kMega)->pSerialPorts->uartPins[1]);
+  EXPECT_EQ(rec.getI2CPortIOPinDefinition(0), &getCircuitBoardInfo(kMega)->pSerialPorts->i2cPins[0]);
+  EXPECT_TRUE(rec.findUartFromPin(34, nPort, nFirst, nSecond));
+  EXPECT_EQ(nPort, 1);
+  EXPECT_EQ(nFirst, 35);
+  EXPECT_EQ(nSecond, 34);
   // A pin of no port: port -1, and the pins those of port 0 (the search ends there).
   EXPECT_FALSE(rec.findUartFromPin(20, nPort, nFirst, nSecond));
   EXPECT_EQ(nPort, -1);
   EXPECT_EQ(nFirst, 16);
   EXPECT_EQ(nSecond, 17);
-  rec.getMapI2CPortToIOPins(0, nFirst, nSecond);
-  EXPECT_EQ(nFirst, 36);
-  EXPECT_EQ(nSecond, 37);
-  EXPECT_TRUE(rec.findI2CFromPin(37, nPort, nFirst, nSecond));
-  EXPECT_EQ(nPort, 0);
-  EXPECT_EQ(rec.getI2CPortIOPinDefinition(0), &getCircuitBoardInfo(kMega)->pSerialPorts->i2cPins[0]);
+  for (const int port : {-1, 4, 6}) EXPECT_EQ(rec.getUARTPortIOPinDefinition(port), nullptr) << port;
   EXPECT_EQ(rec.getI2CPortIOPinDefinition(1), nullptr);
 
-  // A board counting more ports than the record holds: six usable, the rest have no record.
+  // A board counting 8 UARTs: six usable, the other two have neither pins nor a record.
   select(platformArduino, kMegaExpansion);
   EXPECT_EQ(rec.getMaxNumbOfUARTPorts(), 6);
-  EXPECT_EQ(rec.getMaxNumbOfI2CPorts(), 6);
-  rec.getMapUARTPortToIOPins(5, nFirst, nSecond);
-  EXPECT_EQ(nFirst, 51);
-  EXPECT_EQ(nSecond, 50);
   for (const int port : {6, 7}) {
     rec.getMapUARTPortToIOPins(port, nFirst, nSecond);
     EXPECT_EQ(nFirst, -1);
     EXPECT_EQ(rec.getUARTPortIOPinDefinition(port), nullptr);
   }
-  EXPECT_TRUE(rec.findI2CFromPin(46, nPort, nFirst, nSecond));
-  EXPECT_EQ(nPort, 5);
 
-  // Boards without serial ports, and ports without pins.
   select(platformNxt);
-  EXPECT_EQ(rec.getMaxNumbOfUARTPorts(), 0);
   EXPECT_EQ(rec.getUARTPortIOPinDefinition(0), nullptr);
   EXPECT_FALSE(rec.bCanSystemUartPortBeReconfigured());
-  EXPECT_FALSE(rec.findUartFromPin(0, nPort, nFirst, nSecond));
   select(platformVexI2c);
   EXPECT_FALSE(rec.bCanSystemUartPortBeReconfigured());
-  ASSERT_NE(rec.getUARTPortIOPinDefinition(2), nullptr);
-  rec.getMapUARTPortToIOPins(2, nFirst, nSecond);
-  EXPECT_EQ(nFirst, -1);
-  EXPECT_EQ(nSecond, -1);
+  EXPECT_NE(rec.getUARTPortIOPinDefinition(2), nullptr);
 }
 
 TEST_F(SerialPorts, ClaimingAndReleasingPins) {
