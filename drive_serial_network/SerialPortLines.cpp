@@ -174,9 +174,9 @@ bool CRobotConfigurationBasic::buildSourceCodeForSerialPorts() {
     const TBaudRate nBaudRate = settings.nUARTBaudRate[size_t(port)];
     if (nMode == nDefault && (nDefault == kUartNotUsed || nBaudRate == getDefaultBaudRateForUartMode(nDefault)))
       continue;
-    // A port the language has no word for could not be read back.
+    // A port without a word of its own here (the VEX system port) is still
+    // written, so that a changed baud rate stays visible in the program.
     const wchar_t *pzPort = getTypedefEnumString(nUartIndex, port, -1);
-    if (!pzPort || !*pzPort) continue;
     getMapUARTPortToIOPins(port, nFirstPin, nSecondPin);
     sLine.Format(L"#pragma config(%s, %s, %s, %s%s)", TConfigTypeDefns::getConfigTypeName(configTypeUartUsage),
                  pzPort, getTypedefEnumString(nUARTTypes, nMode, -1),
@@ -191,7 +191,6 @@ bool CRobotConfigurationBasic::buildSourceCodeForSerialPorts() {
     const int32_t nMode = settings.nI2CMode[size_t(port)];
     if (nMode == 0) continue;
     const wchar_t *pzPort = getTypedefEnumString(nI2CIndex, port, -1);
-    if (!pzPort || !*pzPort) continue;
     CString sSuffix;
     if (pStyle->bWithPins) {
       getMapI2CPortToIOPins(port, nFirstPin, nSecondPin);

@@ -411,13 +411,14 @@ TEST_F(SerialPorts, WritingLines) {
                         L"#pragma config(UART_Usage, UART2, uartNotUsed, baudRate4800, IOPins, None, None)\r\n"
                         L"#pragma config(I2C_Usage, I2C1, i2cSensors)\r\n");
 
-  // A changed rate is written for a port whose default use is not "not used"; a port
-  // the language has no word for is never written, as it could not be read back.
+  // A changed rate is written for a port whose default use is not "not used",
+  // also for the system port, which has no word of its own on this platform.
   select(platformVexPic);
   rec.setBaudRate(1, 3);
   rec.setBaudRate(0, 3);
   rec.setUARTType(0, 2);
-  EXPECT_EQ(generate(), L"#pragma config(UART_Usage, UART1, uartVEXLCD, baudRate9600, IOPins, None, None)\r\n");
+  EXPECT_EQ(generate(), L"#pragma config(UART_Usage, , uartUserControl, baudRate9600, IOPins, None, None)\r\n"
+                        L"#pragma config(UART_Usage, UART1, uartVEXLCD, baudRate9600, IOPins, None, None)\r\n");
 
   // The I2C line exists on the VEX I2C, Arduino and maker platforms only.
   selectHostPlatform(platformSharedPorts, kUno);
