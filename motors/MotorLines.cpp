@@ -22,6 +22,7 @@ enum class TMotorOptionEffect {
   kNoEncoderPort,  ///< no encoder port
 };
 
+// One option word of a Motor line and what it does.
 struct TMotorOptionKeyword {
   const wchar_t *pzKeyword;
   TMotorOptionEffect nEffect;
@@ -53,7 +54,6 @@ constexpr const wchar_t *kDefaultNameColumn = L" ,";
 // The word of "no encoder port" as a bare option.
 constexpr const wchar_t *kNoPortWord = L"None";
 
-constexpr const wchar_t *kBadMotorIndexMessage = L"Bad motor device index '%s'";
 constexpr const wchar_t *kBadMotorParmMessage = L"Bad motor config parm '%s'";
 constexpr const wchar_t *kInvalidPragmaParmMessage = L"Invalid #pragma '%s' parm '%s'";
 constexpr const wchar_t *kSensorPortSubject = L"Sensor Port";
@@ -101,12 +101,6 @@ int hubTypeOfWord(const CString &sWord) {
   return -1;
 }
 
-// Keyword of a hub value as written in a Hubs line: every known hub type is
-// named, so that a line read back gives the same chain; "none" otherwise.
-const wchar_t *hubWordOfValue(TSensorPortHub nHub) {
-  constexpr int kNumbOfHubTypes = 8;
-  return (nHub >= 0 && nHub < kNumbOfHubTypes && pzMuxTypes[nHub]) ? pzMuxTypes[nHub] : getMuxTypes(-1);
-}
 
 // Characters that end an unquoted parameter of a configuration line.
 constexpr std::wstring_view kParameterBreaks = L" \t,()";
@@ -137,7 +131,7 @@ bool CRobotConfigurationBasic::bParseConfigDefinitionLineMotor(const TTokenizedC
   // The platform's count is trusted only as far as the record's slots reach.
   const int nLimit = std::min(pPlatformData->pMotorParms->nNumbOfMotorPorts, kMaxNumbOfMotors);
   if (nMotor < 0 || nMotor >= nLimit) {
-    sError.Format(kBadMotorIndexMessage, sPort);
+    sError.Format(kBadMotorDeviceIndexMessage, sPort);
     return false;
   }
   const size_t n = size_t(nMotor);
@@ -230,7 +224,7 @@ bool CRobotConfigurationBasic::bParseConfigDefinitionLineRenameMotor(const TToke
   const CString &sPort = parms.sParms[1];
   const int nMotor = getIndexForDefaultMotorName(sPort);
   if (!bIsMotorIndex(nMotor)) {
-    sError.Format(kBadMotorIndexMessage, sPort);
+    sError.Format(kBadMotorDeviceIndexMessage, sPort);
     return false;
   }
   sMotorNames[size_t(nMotor)] = parms.sParms[2];
@@ -361,11 +355,11 @@ bool CRobotConfigurationBasic::buildSourceCodeForMultiplexors() {
     }
     if (!bAnyHub) continue;
     std::array<CString, kNumbOfHubChainPositions - 1> sLeading;
-    for (size_t pos = 0; pos < sLeading.size(); ++pos) sLeading[pos] = CString(hubWordOfValue(chain[pos])) + L",";
+    for (size_t pos = 0; pos < sLeading.size(); ++pos) sLeading[pos] = CString(getMuxTypes(chain[pos])) + L",";
     CString sLine;
     sLine.Format(L"#pragma config(%s,  %s, %-9s %-9s %-9s %s)", TConfigTypeDefns::getConfigTypeName(configTypeHubs),
                  kHubSensorPortNames[size_t(nPort)], sLeading[0], sLeading[1], sLeading[2],
-                 hubWordOfValue(chain[kNumbOfHubChainPositions - 1]));
+                 getMuxTypes(chain[kNumbOfHubChainPositions - 1]));
     addSourceLineToConfiguration(sLine);
     bWritten = true;
   }

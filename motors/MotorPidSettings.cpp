@@ -29,8 +29,6 @@ constexpr std::array<TPidColumn, 8> kPidColumns = {{
 // The value an empty parameter of a MotorPidSetting line stands for.
 constexpr unsigned kEmptyPidValue = 65535;
 
-constexpr const wchar_t *kBadMotorIndexMessage = L"Bad motor device index '%s'";
-
 // Value of one column of a record.
 unsigned pidColumnValue(const TPidSettings &pid, const TPidColumn &column) {
   return column.pByte ? unsigned(pid.*column.pByte) : unsigned(pid.*column.pWord);
@@ -73,7 +71,7 @@ bool CRobotConfigurationBasic::bParseConfigDefinitionLineMotorPidSettings(const 
   const CString &sPort = parms.sParms[1];
   const int nMotor = getIndexForDefaultMotorName(sPort);
   if (!bIsMotorIndex(nMotor)) {
-    sError.Format(kBadMotorIndexMessage, sPort);
+    sError.Format(kBadMotorDeviceIndexMessage, sPort);
     return false;
   }
   TPidSettings &slotSettings = settings.motors[size_t(nMotor)].pidSettings;

@@ -32,21 +32,10 @@ TRecordImage imageOf(const CRobotConfigurationBasic &rec) {
           rec.sServoPositionNames, rec.sStandardModelName, rec.sModelNameUserFile};
 }
 
-// The motor slots that differ, for a readable failure.
-std::string motorDifferences(const TConfigurationSettings &a, const TConfigurationSettings &b) {
-  std::ostringstream out;
-  for (size_t n = 0; n < a.motors.size(); ++n)
-    if (std::memcmp(&a.motors[n], &b.motors[n], sizeof a.motors[n]) != 0)
-      out << " motor " << n << ": type " << a.motors[n].nMotorType << "/" << b.motors[n].nMotorType << " encoder "
-          << int(a.motors[n].bEncoder) << "/" << int(b.motors[n].bEncoder) << " pid "
-          << int(a.motors[n].bPIDControlled) << "/" << int(b.motors[n].bPIDControlled) << " reversed "
-          << int(a.motors[n].bReversed) << "/" << int(b.motors[n].bReversed) << " port " << a.motors[n].nEncoderPort
-          << "/" << b.motors[n].nEncoderPort << ";";
-  return out.str();
-}
-
 void expectSameRecord(const TRecordImage &a, const TRecordImage &b) {
-  EXPECT_EQ(std::memcmp(&a.settings, &b.settings, sizeof a.settings), 0) << motorDifferences(a.settings, b.settings);
+  EXPECT_EQ(std::memcmp(&a.settings, &b.settings, sizeof a.settings), 0);
+  for (size_t n = 0; n < a.settings.motors.size(); ++n)
+    EXPECT_EQ(std::memcmp(&a.settings.motors[n], &b.settings.motors[n], sizeof a.settings.motors[n]), 0) << "motor " << n;
   EXPECT_EQ(a.sMotorNames, b.sMotorNames);
   EXPECT_EQ(a.sSensorNames, b.sSensorNames);
   EXPECT_EQ(a.sServoNames, b.sServoNames);
