@@ -1,4 +1,3 @@
-#include "core/PendingKeywords.h"
 #include "core/RobotConfiguration.h"
 #include "host/DeviceCatalog.h"
 #include "host/Networking.h"
@@ -93,11 +92,6 @@ bool CRobotConfigurationBasic::bParseConfigLineOfType(TConfigTypes nType, const 
     case configTypeAnalog: return bParseConfigDefinitionLineAnalog(parms, sError);
     default: return false;
   }
-}
-
-bool bRejectKeywordNotYetSupported(const TTokenizedConfigParms &parms, CString &sError) {
-  sError.Format(L"Configuration keyword '%s' is not supported yet", parms.sParms[0]);
-  return false;
 }
 
 bool CRobotConfigurationBasic::bParseConfigDefinitionLineCpuParameters(const TTokenizedConfigParms &parms,

@@ -38,9 +38,13 @@ extern "C" int LLVMFuzzerTestOneInput(const uint8_t *data, size_t size) {
   CString sSecond;
   reread.buildSourceCodeForConfiguration(sSecond, false);
   fuzzCheck(sFirst == sSecond, "generation is a fixed point");
-  // The record the generated block gives is the record it was generated from.
+  // The first writing may drop what the written form cannot carry (see the
+  // README); from then on the record that a block gives is the record it came from.
+  CHostRobotConfiguration third;
+  const CProgramText regenerated(sSecond.toUtf8());
+  fuzzCheck(readProgramConfiguration(third, regenerated).empty(), "regenerated lines read back");
   CString sThird;
-  config.buildSourceCodeForConfiguration(sThird, false);  // writing may normalise the first record
-  fuzzCheck(config.compareConfiguration(reread) == configCompareSame, "read-back record compares equal");
+  third.buildSourceCodeForConfiguration(sThird, false);
+  fuzzCheck(reread.compareConfiguration(third) == configCompareSame, "read-back record compares equal");
   return 0;
 }

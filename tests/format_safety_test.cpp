@@ -67,7 +67,9 @@ TEST(FormatSafety, FailedWriteLeavesTheProgramIntact) {
   const auto r = runProcess({"/bin/sh", "-c", "ulimit -f 1; exec \"$0\" \"$@\"", ROBOTCFG_EXE, "format", "-i",
                              "--platform", "arduino", dir.file("p.c")});
   EXPECT_EQ(r.nExit, 2);
-  EXPECT_EQ(r.sErr, "robotcfg: cannot rewrite '" + dir.file("p.c") + "': File too large; the file is unchanged\n");
+  // (A coverage build adds its own complaints about the limit after the tool's message.)
+  const std::string sExpected = "robotcfg: cannot rewrite '" + dir.file("p.c") + "': File too large; the file is unchanged\n";
+  EXPECT_EQ(r.sErr.substr(0, sExpected.size()), sExpected);
   EXPECT_EQ(readFile(dir.file("p.c")), kProgram);
   EXPECT_EQ(entriesIn(dir.path()), 1);
 }

@@ -1,3 +1,4 @@
+#pragma config(CircuitBoardType, typeCktBoardProMini5V)
 #pragma config(CPU_Parameters, ATmega328P, 8000000)
 #pragma config(DatalogSeries, 0, "Light level", lightLevel, 50)
 #pragma config(DatalogSeries, 1, Battery, batteryLevel, 1000)
