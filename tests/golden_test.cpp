@@ -85,7 +85,8 @@ TEST(Examples, OutputsMatchTheRecordedOnes) {
     const TRunResult unchanged = run("format", checkOptions, sFormatted);
     EXPECT_EQ(unchanged.nExit, 0) << unchanged.sErr;
     EXPECT_EQ(unchanged.sOut, "");
-    EXPECT_EQ(unchanged.sErr, "");
+    // Warnings may still be printed (a board change, say); the block itself needs nothing.
+    EXPECT_EQ(unchanged.sErr.find("not in generated form"), std::string::npos) << unchanged.sErr;
   }
 }
 
