@@ -9,10 +9,12 @@
 namespace {
 
 // The configuration block the record generates.
-CString generatedBlock(CRobotConfigurationBasic &config) {
-  CString sGenerated;
-  config.buildSourceCodeForConfiguration(sGenerated, false);
-  return sGenerated;
+// The settled block of a program's configuration; false (after saying so) when it does not settle.
+bool settledBlock(const std::string &sPath, CHostRobotConfiguration &config, CString &sBlock) {
+  if (generateSettledBlock(config, sBlock)) return true;
+  std::fprintf(stderr, "%s: error: the configuration block does not settle when it is regenerated\n",
+               displayName(sPath).c_str());
+  return false;
 }
 
 void writeStdout(const std::string &sBytes) { std::fwrite(sBytes.data(), 1, sBytes.size(), stdout); }
@@ -61,7 +63,12 @@ int runFormat(const TOptions &options) {
       fail(kExitRejected);
       continue;
     }
-    const std::string sFormatted = replaceConfigurationBlock(*program.pText, generatedBlock(*program.pConfig));
+    CString sBlock;
+    if (!settledBlock(sPath, *program.pConfig, sBlock)) {
+      fail(kExitRejected);
+      continue;
+    }
+    const std::string sFormatted = replaceConfigurationBlock(*program.pText, sBlock);
     if (options.bCheckOnly) {
       if (sFormatted != program.pText->bytes()) {
         std::fprintf(stderr, "%s: configuration block is not in generated form\n", displayName(sPath).c_str());
@@ -85,7 +92,9 @@ int runGenerate(const TOptions &options) {
   TReadProgram program;
   if (!readProgramNotingBoard(sPath, program)) return kExitUsage;
   if (reportDiagnostics(sPath, program)) return kExitRejected;
-  writeStdout(encodeGeneratedBlock(generatedBlock(*program.pConfig), program.pText->lineEnding()));
+  CString sBlock;
+  if (!settledBlock(sPath, *program.pConfig, sBlock)) return kExitRejected;
+  writeStdout(encodeGeneratedBlock(sBlock, program.pText->lineEnding()));
   return kExitOk;
 }
 

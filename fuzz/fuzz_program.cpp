@@ -14,7 +14,7 @@ bool formatProgram(const std::string &sBytes, std::string &sOut) {
   const CProgramText program(sBytes);
   if (!readProgramConfiguration(config, program).empty()) return false;
   CString sBlock;
-  config.buildSourceCodeForConfiguration(sBlock, false);
+  fuzzCheck(generateSettledBlock(config, sBlock), "the generated block settles");
   sOut = replaceConfigurationBlock(program, sBlock);
   return true;
 }

@@ -2,6 +2,10 @@
 
 #include <algorithm>
 
+#include "host/HostConfiguration.h"
+#include "host/HostMessages.h"
+#include "host/Platform.h"
+
 CProgramText::CProgramText(std::string sBytes) : m_sBytes(std::move(sBytes)) {
   // An editor's UTF-8 byte-order mark would otherwise hide a configuration line 1.
   if (m_sBytes.compare(0, 3, "\xEF\xBB\xBF") == 0) m_nBomLength = 3;
@@ -91,6 +95,27 @@ std::vector<TConfigurationDiagnostic> readProgramConfiguration(CRobotConfigurati
   config.modifyBoardTypeIfDifferentFromIDESetting();
   config.checkEngineeringRules(true);
   return diagnostics;
+}
+
+bool generateSettledBlock(CHostRobotConfiguration &config, CString &sBlock) {
+  config.buildSourceCodeForConfiguration(sBlock, false);
+  CString sPath;
+  config.getPathName(sPath);
+  // Two rounds settle every case the rules allow; more would mean a fault.
+  constexpr int kMaxRounds = 4;
+  for (int nRound = 0; nRound < kMaxRounds; ++nRound) {
+    // Reading again must neither move the IDE's board nor repeat the warnings.
+    CHostSelectionScope selection;
+    CCapturingMessageSink quiet;
+    CHostRobotConfiguration reread;
+    reread.setPathName(sPath);
+    if (!readProgramConfiguration(reread, CProgramText(sBlock.toUtf8())).empty()) return false;
+    CString sAgain;
+    reread.buildSourceCodeForConfiguration(sAgain, false);
+    if (sAgain == sBlock) return true;
+    sBlock = sAgain;
+  }
+  return false;
 }
 
 std::string encodeGeneratedBlock(const CString &sGenerated, const char *pzLineEnding) {

@@ -66,5 +66,14 @@ std::vector<TConfigurationDiagnostic> readProgramConfiguration(CRobotConfigurati
 /// nothing in a program without one.
 std::string replaceConfigurationBlock(const CProgramText &program, const CString &sGenerated);
 
+class CHostRobotConfiguration;
+
+/// The block `config` generates, settled: a few rules make the first block of
+/// a hand-written configuration read back differently (a board word that
+/// names no board, an I2C use that follows the sensors), so the block is read
+/// back and regenerated until it no longer changes. False when it does not
+/// settle within a few rounds; `sBlock` then holds the last block.
+bool generateSettledBlock(CHostRobotConfiguration &config, CString &sBlock);
+
 /// `sGenerated` with "\r\n" line ends turned into the program's line ending.
 std::string encodeGeneratedBlock(const CString &sGenerated, const char *pzLineEnding);
