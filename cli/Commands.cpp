@@ -11,9 +11,15 @@ namespace {
 // The configuration block the record generates.
 // The settled block of a program's configuration; false (after saying so) when it does not settle.
 bool settledBlock(const std::string &sPath, CHostRobotConfiguration &config, CString &sBlock) {
-  if (generateSettledBlock(config, sBlock)) return true;
-  std::fprintf(stderr, "%s: error: the configuration block does not settle when it is regenerated\n",
-               displayName(sPath).c_str());
+  std::vector<TConfigurationDiagnostic> refused;
+  if (generateSettledBlock(config, sBlock, &refused)) return true;
+  if (refused.empty()) {
+    std::fprintf(stderr, "%s: error: the configuration block does not settle when it is regenerated\n",
+                 displayName(sPath).c_str());
+  }
+  for (const TConfigurationDiagnostic &line : refused)
+    std::fprintf(stderr, "%s: error: the regenerated block would not read back: %s\n", displayName(sPath).c_str(),
+                 line.sMessage.toUtf8().c_str());
   return false;
 }
 

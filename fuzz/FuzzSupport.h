@@ -2,11 +2,14 @@
 #pragma once
 
 #include <cstdint>
+#include <cstdio>
 #include <cstdlib>
 #include <string>
 
+#include "host/HostConfiguration.h"
 #include "host/HostMessages.h"
 #include "host/Platform.h"
+#include "host/ProgramText.h"
 
 /// Selects the platform kind and toggle 1 from the input's first byte and
 /// the IDE board from the second (the platform's own board for values past
@@ -28,6 +31,22 @@ inline void selectPlatformFromInput(const uint8_t *&data, size_t &size) {
     --size;
   }
   selectHostPlatform(nKind, nBoard, bExternal);
+}
+
+/// Stops the run when an invariant does not hold.
+inline void fuzzCheck(bool bHolds, const char *pzWhat);
+
+/// The settled block of `config`; false for the one case the rules leave
+/// unsettled: a drive train or gripper whose line left slots empty writes
+/// "None" there, which the readers refuse (all drive-train slots, gripper
+/// slots 0 and 2). Any other unsettled block stops the run.
+inline bool bSettles(CHostRobotConfiguration &config, CString &sBlock) {
+  std::vector<TConfigurationDiagnostic> refused;
+  if (generateSettledBlock(config, sBlock, &refused)) return true;
+  fuzzCheck(!refused.empty(), "the generated block settles");
+  for (const TConfigurationDiagnostic &line : refused)
+    fuzzCheck(line.sMessage.Find(L"No motor specified for index") == 0, "the generated block reads back");
+  return false;
 }
 
 /// Stops the run when an invariant does not hold.

@@ -97,7 +97,8 @@ std::vector<TConfigurationDiagnostic> readProgramConfiguration(CRobotConfigurati
   return diagnostics;
 }
 
-bool generateSettledBlock(CHostRobotConfiguration &config, CString &sBlock) {
+bool generateSettledBlock(CHostRobotConfiguration &config, CString &sBlock,
+                          std::vector<TConfigurationDiagnostic> *pRefused) {
   config.buildSourceCodeForConfiguration(sBlock, false);
   CString sPath;
   config.getPathName(sPath);
@@ -109,7 +110,11 @@ bool generateSettledBlock(CHostRobotConfiguration &config, CString &sBlock) {
     CCapturingMessageSink quiet;
     CHostRobotConfiguration reread;
     reread.setPathName(sPath);
-    if (!readProgramConfiguration(reread, CProgramText(sBlock.toUtf8())).empty()) return false;
+    std::vector<TConfigurationDiagnostic> refused = readProgramConfiguration(reread, CProgramText(sBlock.toUtf8()));
+    if (!refused.empty()) {
+      if (pRefused) *pRefused = std::move(refused);
+      return false;
+    }
     CString sAgain;
     reread.buildSourceCodeForConfiguration(sAgain, false);
     if (sAgain == sBlock) return true;

@@ -72,8 +72,10 @@ class CHostRobotConfiguration;
 /// a hand-written configuration read back differently (a board word that
 /// names no board, an I2C use that follows the sensors), so the block is read
 /// back and regenerated until it no longer changes. False when it does not
-/// settle within a few rounds; `sBlock` then holds the last block.
-bool generateSettledBlock(CHostRobotConfiguration &config, CString &sBlock);
+/// settle within a few rounds; `sBlock` then holds the last block and
+/// `pRefused`, when given, the lines of it that did not read back.
+bool generateSettledBlock(CHostRobotConfiguration &config, CString &sBlock,
+                          std::vector<TConfigurationDiagnostic> *pRefused = nullptr);
 
 /// `sGenerated` with "\r\n" line ends turned into the program's line ending.
 std::string encodeGeneratedBlock(const CString &sGenerated, const char *pzLineEnding);
