@@ -44,7 +44,7 @@ TFormatArg makeFormatArg(double f) {
 
 namespace {
 
-struct TSpec {
+struct TConversionLayout {
   bool bLeft = false;
   bool bZero = false;
   bool bPlus = false;
@@ -52,13 +52,13 @@ struct TSpec {
   int nPrecision = -1;
 };
 
-// Appends `body` padded to the spec's width; zero padding goes after a sign.
-void appendPadded(std::wstring &out, const std::wstring &body, const TSpec &spec, bool bNumeric) {
-  const int nPad = spec.nWidth > static_cast<int>(body.size()) ? spec.nWidth - static_cast<int>(body.size()) : 0;
-  if (spec.bLeft) {
+// Appends `body` padded to the layout's width; zero padding goes after a sign.
+void appendPadded(std::wstring &out, const std::wstring &body, const TConversionLayout &layout, bool bNumeric) {
+  const int nPad = layout.nWidth > static_cast<int>(body.size()) ? layout.nWidth - static_cast<int>(body.size()) : 0;
+  if (layout.bLeft) {
     out += body;
     out.append(size_t(nPad), L' ');
-  } else if (spec.bZero && bNumeric && spec.nPrecision < 0) {
+  } else if (layout.bZero && bNumeric && layout.nPrecision < 0) {
     size_t nSign = (!body.empty() && (body[0] == L'-' || body[0] == L'+')) ? 1 : 0;
     out.append(body, 0, nSign);
     out.append(size_t(nPad), L'0');
@@ -116,19 +116,19 @@ std::wstring formatWide(const wchar_t *pzFormat, const TFormatArg *pArgs, size_t
       ++p;
       continue;
     }
-    TSpec spec;
+    TConversionLayout layout;
     for (;; ++p) {
-      if (*p == L'-') spec.bLeft = true;
-      else if (*p == L'0') spec.bZero = true;
-      else if (*p == L'+') spec.bPlus = true;
+      if (*p == L'-') layout.bLeft = true;
+      else if (*p == L'0') layout.bZero = true;
+      else if (*p == L'+') layout.bPlus = true;
       else if (*p == L' ' || *p == L'#') continue;
       else break;
     }
-    while (*p >= L'0' && *p <= L'9') spec.nWidth = (spec.nWidth < 0 ? 0 : spec.nWidth * 10) + (*p++ - L'0');
+    while (*p >= L'0' && *p <= L'9') layout.nWidth = (layout.nWidth < 0 ? 0 : layout.nWidth * 10) + (*p++ - L'0');
     if (*p == L'.') {
       ++p;
-      spec.nPrecision = 0;
-      while (*p >= L'0' && *p <= L'9') spec.nPrecision = spec.nPrecision * 10 + (*p++ - L'0');
+      layout.nPrecision = 0;
+      while (*p >= L'0' && *p <= L'9') layout.nPrecision = layout.nPrecision * 10 + (*p++ - L'0');
     }
     while (*p == L'l' || *p == L'h' || *p == L'L' || *p == L'z' || *p == L'j' || *p == L't') ++p;
     const wchar_t conv = *p;
@@ -149,8 +149,8 @@ std::wstring formatWide(const wchar_t *pzFormat, const TFormatArg *pArgs, size_t
       case L's':
       case L'S': {
         std::wstring body = stringOf(arg);
-        if (spec.nPrecision >= 0 && static_cast<int>(body.size()) > spec.nPrecision) body.resize(size_t(spec.nPrecision));
-        appendPadded(out, body, spec, false);
+        if (layout.nPrecision >= 0 && static_cast<int>(body.size()) > layout.nPrecision) body.resize(size_t(layout.nPrecision));
+        appendPadded(out, body, layout, false);
         break;
       }
       case L'c':
@@ -159,39 +159,39 @@ std::wstring formatWide(const wchar_t *pzFormat, const TFormatArg *pArgs, size_t
                     : arg.nKind == TFormatArg::Kind::kUnsigned ? static_cast<wchar_t>(arg.nUnsigned)
                                                                : static_cast<wchar_t>(arg.nSigned);
         if (arg.nKind == TFormatArg::Kind::kString) c = (arg.pzString && *arg.pzString) ? *arg.pzString : L'\0';
-        appendPadded(out, std::wstring(1, c), spec, false);
+        appendPadded(out, std::wstring(1, c), layout, false);
         break;
       }
       case L'd':
       case L'i': {
         if (arg.nKind == TFormatArg::Kind::kString) {
-          appendPadded(out, stringOf(arg), spec, false);
+          appendPadded(out, stringOf(arg), layout, false);
           break;
         }
         const long long v = arg.nKind == TFormatArg::Kind::kUnsigned ? static_cast<long long>(arg.nUnsigned) : arg.nSigned;
         const unsigned long long mag = v < 0 ? 0ULL - static_cast<unsigned long long>(v) : static_cast<unsigned long long>(v);
-        std::wstring body = digits(mag, 10, false, spec.nPrecision);
+        std::wstring body = digits(mag, 10, false, layout.nPrecision);
         if (v < 0) body.insert(body.begin(), L'-');
-        else if (spec.bPlus) body.insert(body.begin(), L'+');
-        appendPadded(out, body, spec, true);
+        else if (layout.bPlus) body.insert(body.begin(), L'+');
+        appendPadded(out, body, layout, true);
         break;
       }
       case L'u':
       case L'x':
       case L'X': {
         if (arg.nKind == TFormatArg::Kind::kString) {
-          appendPadded(out, stringOf(arg), spec, false);
+          appendPadded(out, stringOf(arg), layout, false);
           break;
         }
         // Like C, a negative int printed unsigned shows its 32-bit pattern.
         unsigned long long v = arg.nUnsigned;
         if (arg.nKind != TFormatArg::Kind::kUnsigned && arg.nSigned < 0 && arg.nSigned >= INT32_MIN)
           v = static_cast<uint32_t>(static_cast<int32_t>(arg.nSigned));
-        appendPadded(out, digits(v, conv == L'u' ? 10 : 16, conv == L'X', spec.nPrecision), spec, true);
+        appendPadded(out, digits(v, conv == L'u' ? 10 : 16, conv == L'X', layout.nPrecision), layout, true);
         break;
       }
       default:
-        appendPadded(out, stringOf(arg), spec, true);
+        appendPadded(out, stringOf(arg), layout, true);
         break;
     }
   }
