@@ -54,6 +54,8 @@ coverage:
 # Runs every fuzz harness for FUZZ_SECONDS each (clang with libFuzzer and the sanitizers).
 FUZZ_BUILD_DIR ?= build-fuzz
 FUZZ_SECONDS ?= 60
+# A fixed seed makes a run repeatable: a longer run covers what a shorter one tries.
+FUZZ_SEED ?= 1
 fuzz:
 	@$(CMAKE) -S . -B $(FUZZ_BUILD_DIR) $(GENERATOR) -DCMAKE_CXX_COMPILER=clang++ -DROBOTCONFIG_SANITIZE=ON \
 	  -DROBOTCONFIG_BUILD_FUZZERS=ON -DROBOTCONFIG_BUILD_TESTS=OFF >/dev/null
@@ -62,7 +64,7 @@ fuzz:
 	  name=$$(basename $$harness .cpp); \
 	  work=$(FUZZ_BUILD_DIR)/corpus/$$name; mkdir -p $$work; \
 	  echo "== $$name for $(FUZZ_SECONDS) s"; \
-	  $(FUZZ_BUILD_DIR)/fuzz/$$name -max_total_time=$(FUZZ_SECONDS) -max_len=4096 -print_final_stats=1 \
+	  $(FUZZ_BUILD_DIR)/fuzz/$$name -seed=$(FUZZ_SEED) -max_total_time=$(FUZZ_SECONDS) -max_len=4096 -print_final_stats=1 \
 	    -artifact_prefix=$(FUZZ_BUILD_DIR)/$$name- $$work fuzz/corpus/$$name 2>&1 | \
 	    grep -E '^(stat::number_of_executed_units|stat::average_exec_per_sec|==[0-9]+==|SUMMARY|Done)' || true; \
 	  if ls $(FUZZ_BUILD_DIR)/$$name-* >/dev/null 2>&1; then echo "$$name found a failing input"; exit 1; fi; \
