@@ -14,28 +14,21 @@
 #include "host/Platform.h"
 #include "host/ProgramText.h"
 #include "sensors/ControllerBoards.h"
+#include "tests/config_lines.h"
 
 namespace {
+using test_support::parseLine;
+using test_support::bSameSettings;
+
 
 class Boards : public ::testing::Test {
  protected:
   CHostSelectionScope scope;
 };
 
-bool parseLine(CRobotConfigurationBasic &rec, const std::wstring &sLine, CString &sError) {
-  TTokenizedConfigParms parms;
-  EXPECT_EQ(CRobotConfigurationBasic::nTokenizeLine(sLine, parms), lineTypeConfigPragma) << sLine;
-  sError.Empty();
-  return rec.bParseConfigDefinitionLine(parms, false, TLineNumber(2, 0), L"program.c", sError);
-}
-
 void parseOk(CRobotConfigurationBasic &rec, const std::wstring &sLine) {
   CString sError;
   EXPECT_TRUE(parseLine(rec, sLine, sError)) << sLine << ": " << sError.str();
-}
-
-bool bSameSettings(const CRobotConfigurationBasic &a, const TConfigurationSettings &b) {
-  return std::memcmp(&a.getSettings(), &b, sizeof b) == 0;
 }
 
 // The generated lines of the board keywords (and ProgramType), in the order written.

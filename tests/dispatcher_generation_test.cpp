@@ -10,8 +10,13 @@
 #include "host/HostConfiguration.h"
 #include "host/Platform.h"
 #include "tests/subprocess.h"
+#include "tests/config_lines.h"
 
 namespace {
+using test_support::tokenize;
+using test_support::parseLine;
+using test_support::bSameSettings;
+
 
 // The line that closes every generated block: 86 characters and the line end.
 const std::wstring kCommentLine =
@@ -21,17 +26,6 @@ class ConfigurationText : public ::testing::Test {
  protected:
   CHostSelectionScope scope;
 };
-
-TTokenizedConfigParms tokenize(const std::wstring &sLine) {
-  TTokenizedConfigParms parms;
-  EXPECT_EQ(CRobotConfigurationBasic::nTokenizeLine(sLine, parms), lineTypeConfigPragma) << sLine;
-  return parms;
-}
-
-bool parseLine(CRobotConfigurationBasic &rec, const std::wstring &sLine, CString &sError,
-               TLineNumber line = TLineNumber(3, 0)) {
-  return rec.bParseConfigDefinitionLine(tokenize(sLine), false, line, L"program.c", sError);
-}
 
 // Reads a block the way a host reads a program: clear, every configuration line, the after-reading hooks.
 void readBlock(CRobotConfigurationBasic &rec, const std::wstring &sText) {
@@ -58,10 +52,6 @@ std::wstring generate(CRobotConfigurationBasic &rec, bool &bWritten) {
   CString sText(L"stale");
   bWritten = rec.buildSourceCodeForConfiguration(sText, false);
   return sText.str();
-}
-
-bool bSameSettings(const CRobotConfigurationBasic &a, const TConfigurationSettings &b) {
-  return std::memcmp(&a.getSettings(), &b, sizeof b) == 0;
 }
 
 TEST_F(ConfigurationText, KeywordTable) {

@@ -10,8 +10,13 @@
 #include "host/HostConfiguration.h"
 #include "host/Platform.h"
 #include "tests/subprocess.h"
+#include "tests/config_lines.h"
 
 namespace {
+using test_support::parseLine;
+using test_support::generatedLines;
+using test_support::bSameSettings;
+
 
 class DriveTrain : public ::testing::Test {
  protected:
@@ -19,37 +24,12 @@ class DriveTrain : public ::testing::Test {
   CHostSelectionScope scope;
 };
 
-bool parseLine(CRobotConfigurationBasic &rec, const std::wstring &sLine, CString &sError) {
-  TTokenizedConfigParms parms;
-  EXPECT_EQ(CRobotConfigurationBasic::nTokenizeLine(sLine, parms), lineTypeConfigPragma) << sLine;
-  return rec.bParseConfigDefinitionLine(parms, false, TLineNumber(1, 0), L"program.c", sError);
-}
-
-// The generated lines that start with `sPrefix`, without their line ends.
-std::vector<std::wstring> generatedLines(CRobotConfigurationBasic &rec, const std::wstring &sPrefix) {
-  CString sText;
-  rec.buildSourceCodeForConfiguration(sText, false);
-  std::vector<std::wstring> lines;
-  const std::wstring &s = sText.str();
-  for (size_t pos = 0; pos < s.size();) {
-    size_t end = s.find(L"\r\n", pos);
-    if (end == std::wstring::npos) end = s.size();
-    if (s.compare(pos, sPrefix.size(), sPrefix) == 0) lines.push_back(s.substr(pos, end - pos));
-    pos = end + 2;
-  }
-  return lines;
-}
-
 std::vector<std::wstring> driveLines(CRobotConfigurationBasic &rec) {
   std::vector<std::wstring> lines;
   for (const wchar_t *pzKeyword : {L"DriveTrainMotors", L"DriveTrainWheels", L"GripperArm", L"JoystickDrive"})
     for (const std::wstring &sLine : generatedLines(rec, std::wstring(L"#pragma config(") + pzKeyword + L","))
       lines.push_back(sLine);
   return lines;
-}
-
-bool bSameSettings(const CRobotConfigurationBasic &a, const CRobotConfigurationBasic &b) {
-  return std::memcmp(&a.getSettings(), &b.getSettings(), sizeof(TConfigurationSettings)) == 0;
 }
 
 // Reads the written drive lines into a fresh record and expects the same settings.

@@ -10,19 +10,16 @@
 #include "core/MemoryAllocation.h"
 #include "host/HostConfiguration.h"
 #include "host/Platform.h"
+#include "tests/config_lines.h"
 
 namespace {
+using test_support::parseLine;
+
 
 class MemorySettings : public ::testing::Test {
  protected:
   CHostSelectionScope scope;
 };
-
-bool parseLine(CRobotConfigurationBasic &rec, const std::wstring &sLine, CString &sError) {
-  TTokenizedConfigParms parms;
-  EXPECT_EQ(CRobotConfigurationBasic::nTokenizeLine(sLine, parms), lineTypeConfigPragma) << sLine;
-  return rec.bParseConfigDefinitionLine(parms, false, TLineNumber(1, 0), L"program.c", sError);
-}
 
 std::vector<std::wstring> memoryLines(CRobotConfigurationBasic &rec) {
   CString sText;

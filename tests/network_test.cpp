@@ -11,8 +11,11 @@
 #include "host/Networking.h"
 #include "host/Platform.h"
 #include "host/ProgramText.h"
+#include "tests/config_lines.h"
 
 namespace {
+using test_support::parseLine;
+
 
 using Networking::TNodeSerialNumber;
 
@@ -34,13 +37,6 @@ class Networks : public ::testing::Test {
   CHostSelectionScope selection;
   CCapturingMessageSink messages;
 };
-
-bool parseLine(CRobotConfigurationBasic &rec, const std::wstring &sLine, CString &sError,
-               TLineNumber line = TLineNumber(3, 0)) {
-  TTokenizedConfigParms parms;
-  EXPECT_EQ(CRobotConfigurationBasic::nTokenizeLine(sLine, parms), lineTypeConfigPragma) << sLine;
-  return rec.bParseConfigDefinitionLine(parms, false, line, L"program.c", sError);
-}
 
 void parseLines(CRobotConfigurationBasic &rec, const std::vector<std::wstring> &lines) {
   for (size_t i = 0; i < lines.size(); ++i) {

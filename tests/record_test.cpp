@@ -8,17 +8,16 @@
 #include "host/HostConfiguration.h"
 #include "host/Networking.h"
 #include "host/Platform.h"
+#include "tests/config_lines.h"
 
 namespace {
+using test_support::bSameSettings;
+
 
 class ConfigurationRecord : public ::testing::Test {
  protected:
   CHostSelectionScope scope;
 };
-
-bool bSameSettings(const CRobotConfigurationBasic &a, const CRobotConfigurationBasic &b) {
-  return std::memcmp(&a.getSettings(), &b.getSettings(), sizeof(TConfigurationSettings)) == 0;
-}
 
 std::vector<std::wstring> boardDefaultMotorNames(const CRobotConfigurationBasic &rec) {
   std::vector<std::wstring> names;

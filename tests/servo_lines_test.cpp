@@ -8,36 +8,17 @@
 #include "host/DeviceCatalog.h"
 #include "host/HostConfiguration.h"
 #include "host/Platform.h"
+#include "tests/config_lines.h"
 
 namespace {
+using test_support::parseLine;
+using test_support::generatedLines;
+
 
 class Servos : public ::testing::Test {
  protected:
   CHostSelectionScope scope;
 };
-
-bool parseLine(CRobotConfigurationBasic &rec, const std::wstring &sLine, CString &sError,
-               TLineNumber line = TLineNumber(5, 0)) {
-  TTokenizedConfigParms parms;
-  EXPECT_EQ(CRobotConfigurationBasic::nTokenizeLine(sLine, parms), lineTypeConfigPragma) << sLine;
-  sError.Empty();
-  return rec.bParseConfigDefinitionLine(parms, false, line, L"program.c", sError);
-}
-
-// The generated lines that start with `sPrefix`, without their line ends.
-std::vector<std::wstring> generatedLines(CRobotConfigurationBasic &rec, const std::wstring &sPrefix) {
-  CString sText;
-  rec.buildSourceCodeForConfiguration(sText, false);
-  std::vector<std::wstring> lines;
-  const std::wstring s = sText.str();
-  for (size_t pos = 0; pos < s.size();) {
-    size_t end = s.find(L"\r\n", pos);
-    if (end == std::wstring::npos) end = s.size();
-    if (s.compare(pos, sPrefix.size(), sPrefix) == 0) lines.push_back(s.substr(pos, end - pos));
-    pos = end + 2;
-  }
-  return lines;
-}
 
 std::wstring lowLevelName(const CRobotConfigurationBasic &rec, int nServo, bool bHubNames) {
   CString sName(L"stale");

@@ -19,8 +19,11 @@
 #include "host/StandardModelList.h"
 #include "host/StandardModels.h"
 #include "tests/subprocess.h"
+#include "tests/config_lines.h"
 
 namespace {
+using test_support::parseLine;
+
 
 namespace fs = std::filesystem;
 using testing_support::CTempDir;
@@ -48,13 +51,6 @@ std::vector<std::string> directoryNames(const std::string &sDir) {
   for (const auto &entry : fs::directory_iterator(sDir)) names.push_back(entry.path().filename().string());
   std::sort(names.begin(), names.end());
   return names;
-}
-
-bool parseLine(CRobotConfigurationBasic &rec, const std::wstring &sLine, CString &sError,
-               TLineNumber line = TLineNumber(4, 0), const CString &sSourceFile = L"program.c") {
-  TTokenizedConfigParms parms;
-  EXPECT_EQ(CRobotConfigurationBasic::nTokenizeLine(sLine, parms), lineTypeConfigPragma) << sLine;
-  return rec.bParseConfigDefinitionLine(parms, false, line, sSourceFile, sError);
 }
 
 std::wstring generate(CRobotConfigurationBasic &rec, bool bSkipStandardModel = false) {

@@ -1,0 +1,58 @@
+// Reading single configuration lines and looking at the generated ones: the
+// helpers the line tests share.
+#pragma once
+
+#include <gtest/gtest.h>
+
+#include <cstring>
+#include <string>
+#include <vector>
+
+#include "core/RobotConfiguration.h"
+
+namespace test_support {
+
+/// The tokens of a line that must be a configuration line.
+inline TTokenizedConfigParms tokenize(const std::wstring &sLine) {
+  TTokenizedConfigParms parms;
+  EXPECT_EQ(CRobotConfigurationBasic::nTokenizeLine(CString(sLine), parms), lineTypeConfigPragma) << sLine;
+  return parms;
+}
+
+/// Hands one line to the dispatcher, as the host does.
+inline bool parseLine(CRobotConfigurationBasic &rec, const std::wstring &sLine, CString &sError,
+                      TLineNumber line = TLineNumber(7, 0), const CString &sSourceFile = L"program.c") {
+  return rec.bParseConfigDefinitionLine(tokenize(sLine), false, line, sSourceFile, sError);
+}
+
+/// Reads a line that must be accepted.
+inline void accept(CRobotConfigurationBasic &rec, const std::wstring &sLine) {
+  CString sError;
+  EXPECT_TRUE(parseLine(rec, sLine, sError)) << sLine << ": " << sError.str();
+}
+
+/// The generated lines that start with `sPrefix`, without their line ends.
+inline std::vector<std::wstring> generatedLines(CRobotConfigurationBasic &rec, const std::wstring &sPrefix) {
+  CString sText;
+  rec.buildSourceCodeForConfiguration(sText, false);
+  std::vector<std::wstring> lines;
+  const std::wstring &s = sText.str();
+  for (size_t pos = 0; pos < s.size();) {
+    size_t end = s.find(L"\r\n", pos);
+    if (end == std::wstring::npos) end = s.size();
+    if (s.compare(pos, sPrefix.size(), sPrefix) == 0) lines.push_back(s.substr(pos, end - pos));
+    pos = end + 2;
+  }
+  return lines;
+}
+
+/// True when the record's settings block equals `settings` byte for byte.
+inline bool bSameSettings(const CRobotConfigurationBasic &rec, const TConfigurationSettings &settings) {
+  return std::memcmp(&rec.getSettings(), &settings, sizeof settings) == 0;
+}
+
+inline bool bSameSettings(const CRobotConfigurationBasic &a, const CRobotConfigurationBasic &b) {
+  return bSameSettings(a, b.getSettings());
+}
+
+}  // namespace test_support
