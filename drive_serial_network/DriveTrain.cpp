@@ -57,6 +57,40 @@ void storeInSlot(std::array<T, N> &slots, int nSlot, T value) {
   if (nSlot >= 0 && size_t(nSlot) < N) slots[size_t(nSlot)] = value;
 }
 
+/// Puts `nMotor` into slot `nSlot` of `slots`, of which `nCount` are in use. A
+/// slot beyond the count or a motor the platform lacks leaves the slot empty;
+/// a motor without a type gets the platform's default, since a drive motor needs one.
+template <class T, size_t N>
+void assignSlotMotor(CRobotConfigurationBasic &rec, std::array<T, N> &slots, int nCount, int nSlot, int nMotor,
+                     T empty) {
+  if (nSlot < 0 || nSlot >= nCount || !bIsValidMotorIndex(rec, nMotor)) {
+    storeInSlot(slots, nSlot, empty);
+    return;
+  }
+  slots[size_t(nSlot)] = static_cast<T>(nMotor);
+  if (rec.getMotorTypeInConfig(nMotor) <= 0) rec.setMotorTypeInConfig(nMotor, rec.getDefaultMotorType(nMotor));
+}
+
+/// Type of the motor a slot names; 0 for no motor of the platform.
+TMotorTypes motorTypeOf(const CRobotConfigurationBasic &rec, int nMotor) {
+  return bIsValidMotorIndex(rec, nMotor) ? rec.getMotorTypeInConfig(nMotor) : 0;
+}
+
+/// Sets the type of the motor a slot names, if it names one.
+void setMotorTypeOf(CRobotConfigurationBasic &rec, int nMotor, TMotorTypes nType) {
+  if (bIsValidMotorIndex(rec, nMotor)) rec.setMotorTypeInConfig(nMotor, nType);
+}
+
+/// Direction of the motor a slot names; false for no motor of the platform.
+bool motorReversedOf(const CRobotConfigurationBasic &rec, int nMotor) {
+  return bIsValidMotorIndex(rec, nMotor) && rec.getMotorReversedInConfig(nMotor);
+}
+
+/// Sets the direction of the motor a slot names, if it names one.
+void setMotorReversedOf(CRobotConfigurationBasic &rec, int nMotor, bool bReversed) {
+  if (bIsValidMotorIndex(rec, nMotor)) rec.setMotorReversedInConfig(nMotor, bReversed);
+}
+
 }  // namespace
 
 // ---- Operations ---------------------------------------------------------------
@@ -86,34 +120,24 @@ int CRobotConfigurationBasic::getDriveTrainMotorIndex(int nSlot) const {
 }
 
 void CRobotConfigurationBasic::setDriveTrainMotorIndex(int nSlot, int nMotor) {
-  const bool bSlotValid = nSlot >= 0 && nSlot < getNumbOfMotorsForDriveTrain();
-  if (!bSlotValid || !bIsValidMotorIndex(*this, nMotor)) {
-    storeInSlot(settings.nDriveTrainMotorIndex, nSlot, kNoDriveTrainMotor);
-    return;
-  }
-  settings.nDriveTrainMotorIndex[size_t(nSlot)] = static_cast<uint8_t>(nMotor);
-  // A drive motor needs a type; an empty motor slot gets the platform's default.
-  if (settings.motors[size_t(nMotor)].nMotorType <= 0) setMotorTypeInConfig(nMotor, getDefaultMotorType(nMotor));
+  assignSlotMotor(*this, settings.nDriveTrainMotorIndex, getNumbOfMotorsForDriveTrain(), nSlot, nMotor,
+                  kNoDriveTrainMotor);
 }
 
 TMotorTypes CRobotConfigurationBasic::getDriveTrainMotorType(int nSlot) const {
-  const int nMotor = getDriveTrainMotorIndex(nSlot);
-  return bIsValidMotorIndex(*this, nMotor) ? settings.motors[size_t(nMotor)].nMotorType : 0;
+  return motorTypeOf(*this, getDriveTrainMotorIndex(nSlot));
 }
 
 void CRobotConfigurationBasic::setDriveTrainMotorType(int nSlot, TMotorTypes nType) {
-  const int nMotor = getDriveTrainMotorIndex(nSlot);
-  if (bIsValidMotorIndex(*this, nMotor)) setMotorTypeInConfig(nMotor, nType);
+  setMotorTypeOf(*this, getDriveTrainMotorIndex(nSlot), nType);
 }
 
 bool CRobotConfigurationBasic::getDriveTrainMotorReversed(int nSlot) const {
-  const int nMotor = getDriveTrainMotorIndex(nSlot);
-  return bIsValidMotorIndex(*this, nMotor) && settings.motors[size_t(nMotor)].bReversed;
+  return motorReversedOf(*this, getDriveTrainMotorIndex(nSlot));
 }
 
 void CRobotConfigurationBasic::setDriveTrainMotorReversed(int nSlot, bool bReversed) {
-  const int nMotor = getDriveTrainMotorIndex(nSlot);
-  if (bIsValidMotorIndex(*this, nMotor)) settings.motors[size_t(nMotor)].bReversed = bReversed;
+  setMotorReversedOf(*this, getDriveTrainMotorIndex(nSlot), bReversed);
 }
 
 int CRobotConfigurationBasic::getGripperArmMotorIndex(int nSlot) const {
@@ -122,33 +146,24 @@ int CRobotConfigurationBasic::getGripperArmMotorIndex(int nSlot) const {
 }
 
 void CRobotConfigurationBasic::setGripperArmMotorIndex(int nSlot, int nMotor) {
-  const bool bSlotValid = nSlot >= 0 && nSlot < getNumbOfMotorsForGripperArm();
-  if (!bSlotValid || !bIsValidMotorIndex(*this, nMotor)) {
-    storeInSlot(settings.nGripperArmMotorIndex, nSlot, kNoGripperMotor);
-    return;
-  }
-  settings.nGripperArmMotorIndex[size_t(nSlot)] = nMotor;
-  if (settings.motors[size_t(nMotor)].nMotorType <= 0) setMotorTypeInConfig(nMotor, getDefaultMotorType(nMotor));
+  assignSlotMotor(*this, settings.nGripperArmMotorIndex, getNumbOfMotorsForGripperArm(), nSlot, nMotor,
+                  kNoGripperMotor);
 }
 
 TMotorTypes CRobotConfigurationBasic::getGripperArmMotorType(int nSlot) const {
-  const int nMotor = getGripperArmMotorIndex(nSlot);
-  return bIsValidMotorIndex(*this, nMotor) ? settings.motors[size_t(nMotor)].nMotorType : 0;
+  return motorTypeOf(*this, getGripperArmMotorIndex(nSlot));
 }
 
 void CRobotConfigurationBasic::setGripperArmMotorType(int nSlot, TMotorTypes nType) {
-  const int nMotor = getGripperArmMotorIndex(nSlot);
-  if (bIsValidMotorIndex(*this, nMotor)) setMotorTypeInConfig(nMotor, nType);
+  setMotorTypeOf(*this, getGripperArmMotorIndex(nSlot), nType);
 }
 
 bool CRobotConfigurationBasic::getGripperArmMotorReversed(int nSlot) const {
-  const int nMotor = getGripperArmMotorIndex(nSlot);
-  return bIsValidMotorIndex(*this, nMotor) && settings.motors[size_t(nMotor)].bReversed;
+  return motorReversedOf(*this, getGripperArmMotorIndex(nSlot));
 }
 
 void CRobotConfigurationBasic::setGripperArmMotorReversed(int nSlot, bool bReversed) {
-  const int nMotor = getGripperArmMotorIndex(nSlot);
-  if (bIsValidMotorIndex(*this, nMotor)) settings.motors[size_t(nMotor)].bReversed = bReversed;
+  setMotorReversedOf(*this, getGripperArmMotorIndex(nSlot), bReversed);
 }
 
 void CRobotConfigurationBasic::initializeEmptyMotor(int nMotor) {
