@@ -9,6 +9,7 @@
 #include <vector>
 
 #include "core/RobotConfiguration.h"
+#include "host/StandardModels.h"
 
 namespace test_support {
 
@@ -54,5 +55,30 @@ inline bool bSameSettings(const CRobotConfigurationBasic &rec, const TConfigurat
 inline bool bSameSettings(const CRobotConfigurationBasic &a, const CRobotConfigurationBasic &b) {
   return bSameSettings(a, b.getSettings());
 }
+
+/// A standard-model list that holds one model under one name.
+class COneModelList : public CStandardModelRobotConfigurationList {
+ public:
+  COneModelList(const CRobotConfigurationBasic &model, const wchar_t *pzName) : m_model(model), m_sName(pzName) {}
+  virtual ~COneModelList() = default;
+  int getNumbOfModels() const override { return 1; }
+  const CRobotConfigurationBasic *getModel(int) const override { return &m_model; }
+  void getModelName(int, CString &sName) const override { sName = m_sName; }
+  bool bAddModel(const CString &, const CRobotConfigurationBasic &) override { return false; }
+  bool bRemoveModel(const CString &) override { return false; }
+  void removeAllModels() override {}
+  bool bLoadModels(const CString &) override { return false; }
+  bool bSaveModels(const CString &) const override { return false; }
+  int findModelIndex(const CString &sName) const override { return sName == m_sName ? 0 : -1; }
+  const CRobotConfigurationBasic *findStandardModel(const CString &sName) const override {
+    return sName == m_sName ? &m_model : nullptr;
+  }
+  bool bIsModelModified(int) const override { return false; }
+  void setModelModified(int, bool) override {}
+
+ private:
+  const CRobotConfigurationBasic &m_model;
+  CString m_sName;
+};
 
 }  // namespace test_support

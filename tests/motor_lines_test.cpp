@@ -16,6 +16,7 @@
 namespace {
 using test_support::parseLine;
 using test_support::accept;
+using test_support::COneModelList;
 using test_support::generatedLines;
 
 
@@ -346,30 +347,6 @@ TEST_F(MotorLines, HubsLineRefusals) {
   EXPECT_EQ(rec.getSettings().nSensorPortHubs[1][0], hubHTMotor);
 }
 
-// A standard-model list of one model, for the rename writer.
-class COneModelList : public CStandardModelRobotConfigurationList {
- public:
-  explicit COneModelList(const CRobotConfigurationBasic &model) : m_model(model) {}
-  virtual ~COneModelList() = default;
-  int getNumbOfModels() const override { return 1; }
-  const CRobotConfigurationBasic *getModel(int) const override { return &m_model; }
-  void getModelName(int, CString &sName) const override { sName = L"Tribot"; }
-  bool bAddModel(const CString &, const CRobotConfigurationBasic &) override { return false; }
-  bool bRemoveModel(const CString &) override { return false; }
-  void removeAllModels() override {}
-  bool bLoadModels(const CString &) override { return false; }
-  bool bSaveModels(const CString &) const override { return false; }
-  int findModelIndex(const CString &sName) const override { return sName == L"Tribot" ? 0 : -1; }
-  const CRobotConfigurationBasic *findStandardModel(const CString &sName) const override {
-    return sName == L"Tribot" ? &m_model : nullptr;
-  }
-  bool bIsModelModified(int) const override { return false; }
-  void setModelModified(int, bool) override {}
-
- private:
-  const CRobotConfigurationBasic &m_model;
-};
-
 TEST_F(MotorLines, RenamedStandardModelMotors) {
   selectHostPlatform(platformNxt);
   CHostRobotConfiguration rec;
@@ -390,7 +367,7 @@ TEST_F(MotorLines, RenamedStandardModelMotors) {
 
   // The model's names are left out; the names that differ are written.
   CHostRobotConfiguration model;
-  COneModelList models(model);
+  COneModelList models(model, L"Tribot");
   CStandardModelRobotConfigurationList *pPrevious = pStandardRobotModels;
   pStandardRobotModels = &models;
   rec.sMotorNames[0].Empty();

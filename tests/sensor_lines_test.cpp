@@ -12,8 +12,10 @@
 #include "host/Platform.h"
 #include "host/ProgramText.h"
 #include "host/StandardModels.h"
+#include "tests/config_lines.h"
 
 namespace {
+using test_support::COneModelList;
 
 constexpr const wchar_t *kSensorLinePrefix = L"#pragma config(Sensor,";
 
@@ -293,30 +295,6 @@ TEST_F(SensorLines, ModeAfterSecondaryAndI2CColumnsReadsBack) {
   EXPECT_EQ(sensorLines(rec), expected);
 }
 
-// A standard-model list of one model, for the rename writer.
-class COneModelList : public CStandardModelRobotConfigurationList {
- public:
-  explicit COneModelList(const CRobotConfigurationBasic &model) : m_model(model) {}
-  virtual ~COneModelList() = default;
-  int getNumbOfModels() const override { return 1; }
-  const CRobotConfigurationBasic *getModel(int) const override { return &m_model; }
-  void getModelName(int, CString &sName) const override { sName = L"Bot"; }
-  bool bAddModel(const CString &, const CRobotConfigurationBasic &) override { return false; }
-  bool bRemoveModel(const CString &) override { return false; }
-  void removeAllModels() override {}
-  bool bLoadModels(const CString &) override { return false; }
-  bool bSaveModels(const CString &) const override { return false; }
-  int findModelIndex(const CString &sName) const override { return sName == L"Bot" ? 0 : -1; }
-  const CRobotConfigurationBasic *findStandardModel(const CString &sName) const override {
-    return sName == L"Bot" ? &m_model : nullptr;
-  }
-  bool bIsModelModified(int) const override { return false; }
-  void setModelModified(int, bool) override {}
-
- private:
-  const CRobotConfigurationBasic &m_model;
-};
-
 TEST_F(SensorLines, RenameLinesForNamesThatDifferFromTheModel) {
   select(platformNxt);
   CHostRobotConfiguration model;
@@ -324,7 +302,7 @@ TEST_F(SensorLines, RenameLinesForNamesThatDifferFromTheModel) {
   model.setUserDefinedSensorNameInConfig(0, L"touch", TLineNumber(1, 0));
   model.setSensorTypeInConfig(2, 5);
   model.setUserDefinedSensorNameInConfig(2, L"light", TLineNumber(1, 0));
-  COneModelList models(model);
+  COneModelList models(model, L"Bot");
   CStandardModelRobotConfigurationList *pPrevious = pStandardRobotModels;
   pStandardRobotModels = &models;
 
