@@ -47,8 +47,8 @@ coverage:
 	$(CMAKE) --build $(COVERAGE_BUILD_DIR) -j $(JOBS)
 	find $(COVERAGE_BUILD_DIR) -name '*.gcda' -delete
 	cd $(COVERAGE_BUILD_DIR) && ctest >/dev/null || echo 'some tests failed; coverage is of the run as it went'
-	gcovr --root . --object-directory $(COVERAGE_BUILD_DIR) --filter 'core/' --filter 'motors/' --filter 'sensors/' \
-	  --filter 'drive_serial_network/' --filter 'host/' --exclude-unreachable-branches --exclude-throw-branches --gcov-ignore-parse-errors \
+	gcovr --root . --object-directory $(COVERAGE_BUILD_DIR) --filter robotconfig/ \
+	  --exclude-unreachable-branches --exclude-throw-branches --gcov-ignore-parse-errors \
 	  --print-summary --txt $(COVERAGE_BUILD_DIR)/coverage.txt
 
 # Runs every fuzz harness for FUZZ_SECONDS each (clang with libFuzzer and the sanitizers).

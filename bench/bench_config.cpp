@@ -4,10 +4,10 @@
 
 #include <string>
 
-#include "host/HostConfiguration.h"
-#include "host/HostMessages.h"
-#include "host/Platform.h"
-#include "host/ProgramText.h"
+#include "robotconfig/program/HostConfiguration.h"
+#include "robotconfig/host/HostMessages.h"
+#include "robotconfig/host/Platform.h"
+#include "robotconfig/program/ProgramText.h"
 
 namespace {
 

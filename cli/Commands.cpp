@@ -3,8 +3,8 @@
 #include <cstdio>
 
 #include "cli/ReadProgram.h"
-#include "host/FileIO.h"
-#include "host/Platform.h"
+#include "robotconfig/program/FileIO.h"
+#include "robotconfig/host/Platform.h"
 
 namespace {
 

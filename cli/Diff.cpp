@@ -6,9 +6,9 @@
 
 #include "cli/Commands.h"
 #include "cli/ReadProgram.h"
-#include "drive_serial_network/SerialPorts.h"
-#include "host/DeviceCatalog.h"
-#include "host/Platform.h"
+#include "robotconfig/drive_serial_network/SerialPorts.h"
+#include "robotconfig/host/DeviceCatalog.h"
+#include "robotconfig/host/Platform.h"
 
 namespace {
 

@@ -4,8 +4,8 @@
 
 #include "cli/Commands.h"
 #include "cli/ReadProgram.h"
-#include "host/HostMessages.h"
-#include "host/StandardModelList.h"
+#include "robotconfig/host/HostMessages.h"
+#include "robotconfig/program/StandardModelList.h"
 
 namespace {
 

@@ -3,9 +3,9 @@
 #include <cstdlib>
 #include <cstring>
 
-#include "host/CString.h"
-#include "host/DeviceCatalog.h"
-#include "host/Platform.h"
+#include "robotconfig/host/CString.h"
+#include "robotconfig/host/DeviceCatalog.h"
+#include "robotconfig/host/Platform.h"
 
 namespace {
 

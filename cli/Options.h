@@ -4,7 +4,7 @@
 #include <string>
 #include <vector>
 
-#include "host/DeviceTypes.h"
+#include "robotconfig/host/DeviceTypes.h"
 
 enum class TCommand { kNone, kCheck, kFormat, kGenerate, kShow, kDiff, kModels, kSaveModel };
 

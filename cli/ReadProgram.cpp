@@ -3,7 +3,7 @@
 #include <cstdio>
 #include <utility>
 
-#include "host/FileIO.h"
+#include "robotconfig/program/FileIO.h"
 
 CWarningPrinter::CWarningPrinter(std::string sFile)
     : m_sFile(std::move(sFile)), m_pPrevious(setHostMessageSink(this)) {}

@@ -6,9 +6,9 @@
 #include <string>
 #include <vector>
 
-#include "host/HostConfiguration.h"
-#include "host/HostMessages.h"
-#include "host/ProgramText.h"
+#include "robotconfig/program/HostConfiguration.h"
+#include "robotconfig/host/HostMessages.h"
+#include "robotconfig/program/ProgramText.h"
 
 /// Prints the library's messages as warnings of the file being read, while it lives.
 class CWarningPrinter : public CHostMessageSink {

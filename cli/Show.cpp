@@ -2,10 +2,10 @@
 #include <string>
 
 #include "cli/Commands.h"
-#include "core/RobotConfiguration.h"
-#include "drive_serial_network/SerialPorts.h"
-#include "host/DeviceCatalog.h"
-#include "host/Platform.h"
+#include "robotconfig/core/RobotConfiguration.h"
+#include "robotconfig/drive_serial_network/SerialPorts.h"
+#include "robotconfig/host/DeviceCatalog.h"
+#include "robotconfig/host/Platform.h"
 
 namespace {
 

@@ -3,10 +3,10 @@
 #include <string>
 
 #include "cli/Commands.h"
-#include "core/RobotConfiguration.h"
-#include "host/DeviceCatalog.h"
-#include "host/Platform.h"
-#include "sensors/ControllerBoards.h"
+#include "robotconfig/core/RobotConfiguration.h"
+#include "robotconfig/host/DeviceCatalog.h"
+#include "robotconfig/host/Platform.h"
+#include "robotconfig/sensors/ControllerBoards.h"
 
 namespace {
 

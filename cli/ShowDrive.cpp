@@ -3,10 +3,10 @@
 #include <string>
 
 #include "cli/Commands.h"
-#include "core/MemoryAllocation.h"
-#include "core/RobotConfiguration.h"
-#include "drive_serial_network/ProgramTypes.h"
-#include "host/DeviceCatalog.h"
+#include "robotconfig/core/MemoryAllocation.h"
+#include "robotconfig/core/RobotConfiguration.h"
+#include "robotconfig/drive_serial_network/ProgramTypes.h"
+#include "robotconfig/host/DeviceCatalog.h"
 
 namespace {
 

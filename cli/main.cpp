@@ -7,8 +7,8 @@
 
 #include "cli/Commands.h"
 #include "cli/Options.h"
-#include "host/Platform.h"
-#include "host/StandardModelList.h"
+#include "robotconfig/host/Platform.h"
+#include "robotconfig/program/StandardModelList.h"
 
 #ifndef ROBOTCONFIG_VERSION
 #define ROBOTCONFIG_VERSION "0.1.0"

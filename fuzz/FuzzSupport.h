@@ -6,10 +6,10 @@
 #include <cstdlib>
 #include <string>
 
-#include "host/HostConfiguration.h"
-#include "host/HostMessages.h"
-#include "host/Platform.h"
-#include "host/ProgramText.h"
+#include "robotconfig/program/HostConfiguration.h"
+#include "robotconfig/host/HostMessages.h"
+#include "robotconfig/host/Platform.h"
+#include "robotconfig/program/ProgramText.h"
 
 /// Selects the platform kind and toggle 1 from the input's first byte and
 /// the IDE board from the second (the platform's own board for values past

@@ -3,10 +3,10 @@
 // without error, write the same text, and give an equal record.
 #include <string_view>
 
-#include "core/RobotConfiguration.h"
+#include "robotconfig/core/RobotConfiguration.h"
 #include "fuzz/FuzzSupport.h"
-#include "host/HostConfiguration.h"
-#include "host/ProgramText.h"
+#include "robotconfig/program/HostConfiguration.h"
+#include "robotconfig/program/ProgramText.h"
 
 extern "C" int LLVMFuzzerTestOneInput(const uint8_t *data, size_t size) {
   CHostSelectionScope scope;

@@ -3,8 +3,8 @@
 #include <string_view>
 
 #include "fuzz/FuzzSupport.h"
-#include "host/HostConfiguration.h"
-#include "host/ProgramText.h"
+#include "robotconfig/program/HostConfiguration.h"
+#include "robotconfig/program/ProgramText.h"
 
 namespace {
 

@@ -1,7 +1,7 @@
 // Tokenizes arbitrary bytes as one source line and checks the token limits.
 #include <string_view>
 
-#include "core/RobotConfiguration.h"
+#include "robotconfig/core/RobotConfiguration.h"
 #include "fuzz/FuzzSupport.h"
 
 extern "C" int LLVMFuzzerTestOneInput(const uint8_t *data, size_t size) {

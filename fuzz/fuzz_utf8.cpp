@@ -2,7 +2,7 @@
 #include <string_view>
 
 #include "fuzz/FuzzSupport.h"
-#include "host/CString.h"
+#include "robotconfig/host/CString.h"
 
 extern "C" int LLVMFuzzerTestOneInput(const uint8_t *data, size_t size) {
   const std::string_view bytes(reinterpret_cast<const char *>(data), size);

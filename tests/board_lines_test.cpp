@@ -8,12 +8,12 @@
 #include <utility>
 #include <vector>
 
-#include "host/DeviceCatalog.h"
-#include "host/HostConfiguration.h"
-#include "host/HostMessages.h"
-#include "host/Platform.h"
-#include "host/ProgramText.h"
-#include "sensors/ControllerBoards.h"
+#include "robotconfig/host/DeviceCatalog.h"
+#include "robotconfig/program/HostConfiguration.h"
+#include "robotconfig/host/HostMessages.h"
+#include "robotconfig/host/Platform.h"
+#include "robotconfig/program/ProgramText.h"
+#include "robotconfig/sensors/ControllerBoards.h"
 #include "tests/config_lines.h"
 
 namespace {

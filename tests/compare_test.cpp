@@ -8,9 +8,9 @@
 #include <string>
 #include <vector>
 
-#include "host/HostConfiguration.h"
-#include "host/Networking.h"
-#include "host/Platform.h"
+#include "robotconfig/program/HostConfiguration.h"
+#include "robotconfig/host/Networking.h"
+#include "robotconfig/host/Platform.h"
 
 namespace {
 

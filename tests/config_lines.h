@@ -8,8 +8,8 @@
 #include <string>
 #include <vector>
 
-#include "core/RobotConfiguration.h"
-#include "host/StandardModels.h"
+#include "robotconfig/core/RobotConfiguration.h"
+#include "robotconfig/host/StandardModels.h"
 
 namespace test_support {
 

@@ -6,7 +6,7 @@
 #include <random>
 #include <string>
 
-#include "host/CString.h"
+#include "robotconfig/host/CString.h"
 
 using namespace std::string_literals;
 

@@ -6,9 +6,9 @@
 #include <string>
 #include <vector>
 
-#include "host/DeviceCatalog.h"
-#include "host/HostConfiguration.h"
-#include "host/Platform.h"
+#include "robotconfig/host/DeviceCatalog.h"
+#include "robotconfig/program/HostConfiguration.h"
+#include "robotconfig/host/Platform.h"
 #include "tests/subprocess.h"
 #include "tests/config_lines.h"
 

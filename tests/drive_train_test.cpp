@@ -7,8 +7,8 @@
 #include <string>
 #include <vector>
 
-#include "host/HostConfiguration.h"
-#include "host/Platform.h"
+#include "robotconfig/program/HostConfiguration.h"
+#include "robotconfig/host/Platform.h"
 #include "tests/subprocess.h"
 #include "tests/config_lines.h"
 

@@ -11,7 +11,7 @@
 #include <sstream>
 #include <string>
 
-#include "host/FileIO.h"
+#include "robotconfig/program/FileIO.h"
 #include "tests/subprocess.h"
 
 namespace {

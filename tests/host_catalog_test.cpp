@@ -5,9 +5,9 @@
 #include <string>
 #include <vector>
 
-#include "host/CatalogRows.h"
-#include "host/DeviceCatalog.h"
-#include "host/Platform.h"
+#include "robotconfig/host/CatalogRows.h"
+#include "robotconfig/host/DeviceCatalog.h"
+#include "robotconfig/host/Platform.h"
 
 using robotconfig_catalog::aliasRow;
 using robotconfig_catalog::kEndOfTable;

@@ -2,7 +2,7 @@
 
 #include <string>
 
-#include "host/HostMessages.h"
+#include "robotconfig/host/HostMessages.h"
 
 TEST(HostMessages, CapturingSinkKeepsEveryMessage) {
   CCapturingMessageSink sink;

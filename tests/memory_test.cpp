@@ -7,9 +7,9 @@
 #include <string>
 #include <vector>
 
-#include "core/MemoryAllocation.h"
-#include "host/HostConfiguration.h"
-#include "host/Platform.h"
+#include "robotconfig/core/MemoryAllocation.h"
+#include "robotconfig/program/HostConfiguration.h"
+#include "robotconfig/host/Platform.h"
 #include "tests/config_lines.h"
 
 namespace {

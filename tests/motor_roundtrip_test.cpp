@@ -10,9 +10,9 @@
 #include <string>
 #include <vector>
 
-#include "host/HostConfiguration.h"
-#include "host/Platform.h"
-#include "host/ProgramText.h"
+#include "robotconfig/program/HostConfiguration.h"
+#include "robotconfig/host/Platform.h"
+#include "robotconfig/program/ProgramText.h"
 
 namespace {
 

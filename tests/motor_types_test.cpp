@@ -5,9 +5,9 @@
 #include <set>
 #include <string>
 
-#include "host/HostConfiguration.h"
-#include "host/Platform.h"
-#include "motors/MotorTypes.h"
+#include "robotconfig/program/HostConfiguration.h"
+#include "robotconfig/host/Platform.h"
+#include "robotconfig/motors/MotorTypes.h"
 
 namespace {
 

@@ -5,12 +5,12 @@
 #include <string>
 #include <vector>
 
-#include "host/HostConfiguration.h"
-#include "host/HostMessages.h"
-#include "host/NetworkRegistry.h"
-#include "host/Networking.h"
-#include "host/Platform.h"
-#include "host/ProgramText.h"
+#include "robotconfig/program/HostConfiguration.h"
+#include "robotconfig/host/HostMessages.h"
+#include "robotconfig/host/NetworkRegistry.h"
+#include "robotconfig/host/Networking.h"
+#include "robotconfig/host/Platform.h"
+#include "robotconfig/program/ProgramText.h"
 #include "tests/config_lines.h"
 
 namespace {

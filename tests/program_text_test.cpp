@@ -5,9 +5,9 @@
 #include <string>
 #include <vector>
 
-#include "host/HostConfiguration.h"
-#include "host/Platform.h"
-#include "host/ProgramText.h"
+#include "robotconfig/program/HostConfiguration.h"
+#include "robotconfig/host/Platform.h"
+#include "robotconfig/program/ProgramText.h"
 #include "tests/subprocess.h"
 
 namespace {

@@ -4,10 +4,10 @@
 #include <string>
 #include <vector>
 
-#include "drive_serial_network/ProgramTypes.h"
-#include "host/DeviceCatalog.h"
-#include "host/HostConfiguration.h"
-#include "host/Platform.h"
+#include "robotconfig/drive_serial_network/ProgramTypes.h"
+#include "robotconfig/host/DeviceCatalog.h"
+#include "robotconfig/program/HostConfiguration.h"
+#include "robotconfig/host/Platform.h"
 #include "tests/config_lines.h"
 
 namespace {

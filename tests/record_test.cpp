@@ -5,9 +5,9 @@
 #include <string>
 #include <vector>
 
-#include "host/HostConfiguration.h"
-#include "host/Networking.h"
-#include "host/Platform.h"
+#include "robotconfig/program/HostConfiguration.h"
+#include "robotconfig/host/Networking.h"
+#include "robotconfig/host/Platform.h"
 #include "tests/config_lines.h"
 
 namespace {

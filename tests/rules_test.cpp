@@ -3,9 +3,9 @@
 
 #include <string>
 
-#include "host/HostConfiguration.h"
-#include "host/HostMessages.h"
-#include "host/Platform.h"
+#include "robotconfig/program/HostConfiguration.h"
+#include "robotconfig/host/HostMessages.h"
+#include "robotconfig/host/Platform.h"
 
 namespace {
 

@@ -5,11 +5,11 @@
 #include <cstring>
 #include <string>
 
-#include "host/DeviceCatalog.h"
-#include "host/HostConfiguration.h"
-#include "host/MenuButton.h"
-#include "host/Platform.h"
-#include "sensors/SensorMenus.h"
+#include "robotconfig/host/DeviceCatalog.h"
+#include "robotconfig/program/HostConfiguration.h"
+#include "robotconfig/host/MenuButton.h"
+#include "robotconfig/host/Platform.h"
+#include "robotconfig/sensors/SensorMenus.h"
 
 namespace {
 

@@ -7,11 +7,11 @@
 #include <string>
 #include <vector>
 
-#include "host/DeviceCatalog.h"
-#include "host/HostConfiguration.h"
-#include "host/Platform.h"
-#include "host/ProgramText.h"
-#include "host/StandardModels.h"
+#include "robotconfig/host/DeviceCatalog.h"
+#include "robotconfig/program/HostConfiguration.h"
+#include "robotconfig/host/Platform.h"
+#include "robotconfig/program/ProgramText.h"
+#include "robotconfig/host/StandardModels.h"
 #include "tests/config_lines.h"
 
 namespace {

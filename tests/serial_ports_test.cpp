@@ -7,11 +7,11 @@
 #include <string>
 #include <vector>
 
-#include "drive_serial_network/SerialPorts.h"
-#include "host/DeviceCatalog.h"
-#include "host/HostConfiguration.h"
-#include "host/Platform.h"
-#include "host/ProgramText.h"
+#include "robotconfig/drive_serial_network/SerialPorts.h"
+#include "robotconfig/host/DeviceCatalog.h"
+#include "robotconfig/program/HostConfiguration.h"
+#include "robotconfig/host/Platform.h"
+#include "robotconfig/program/ProgramText.h"
 
 namespace {
 

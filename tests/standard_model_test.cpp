@@ -12,12 +12,12 @@
 #include <utility>
 #include <vector>
 
-#include "host/HostConfiguration.h"
-#include "host/HostMessages.h"
-#include "host/Platform.h"
-#include "host/ProgramText.h"
-#include "host/StandardModelList.h"
-#include "host/StandardModels.h"
+#include "robotconfig/program/HostConfiguration.h"
+#include "robotconfig/host/HostMessages.h"
+#include "robotconfig/host/Platform.h"
+#include "robotconfig/program/ProgramText.h"
+#include "robotconfig/program/StandardModelList.h"
+#include "robotconfig/host/StandardModels.h"
 #include "tests/subprocess.h"
 #include "tests/config_lines.h"
 

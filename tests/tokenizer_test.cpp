@@ -5,7 +5,7 @@
 #include <string>
 #include <vector>
 
-#include "core/RobotConfiguration.h"
+#include "robotconfig/core/RobotConfiguration.h"
 
 using namespace std::string_literals;
 

@@ -1,0 +1,190 @@
+#include "robotconfig/program/ProgramText.h"
+
+#include <algorithm>
+
+#include "robotconfig/program/HostConfiguration.h"
+#include "robotconfig/host/HostMessages.h"
+#include "robotconfig/host/Platform.h"
+
+CProgramText::CProgramText(std::string sBytes) : m_sBytes(std::move(sBytes)) {
+  // An editor's UTF-8 byte-order mark would otherwise hide a configuration line 1.
+  if (m_sBytes.compare(0, 3, "\xEF\xBB\xBF") == 0) m_nBomLength = 3;
+  size_t nStart = m_nBomLength;
+  bool bFirstEnd = true;
+  while (nStart < m_sBytes.size()) {
+    const size_t nNewline = m_sBytes.find('\n', nStart);
+    if (nNewline == std::string::npos) {
+      m_lines.push_back({nStart, m_sBytes.size() - nStart, 0});
+      break;
+    }
+    const bool bCr = nNewline > nStart && m_sBytes[nNewline - 1] == '\r';
+    if (bFirstEnd) {
+      m_bCrLf = bCr;
+      bFirstEnd = false;
+    }
+    const size_t nLength = nNewline - nStart - (bCr ? 1 : 0);
+    m_lines.push_back({nStart, nLength, bCr ? size_t(2) : size_t(1)});
+    nStart = nNewline + 1;
+  }
+}
+
+std::string_view CProgramText::lineText(size_t nIndex) const {
+  const TLine &line = m_lines.at(nIndex);
+  return std::string_view(m_sBytes).substr(line.nOffset, line.nLength);
+}
+
+namespace {
+
+// What a line is to the block finder.
+enum class TLineRole { kOther, kBlank, kConfig, kMarker };
+
+// The role of one line: configuration lines and the marker lines that close a
+// block are part of it; so are blank lines inside it.
+TLineRole lineRole(const CString &sLine) {
+  TTokenizedConfigParms parms;
+  switch (CRobotConfigurationBasic::nTokenizeLine(sLine, parms)) {
+    case lineTypeBlank:
+      return TLineRole::kBlank;
+    case lineTypeConfigPragma:
+      return TLineRole::kConfig;
+    case lineTypeMarkerComment:
+      return TLineRole::kMarker;
+    case lineTypeNoTokens: {
+      // Only the marker forms close a block; "#pragma config()" and the like do not.
+      CString sTrimmed(sLine);
+      sTrimmed.TrimLeft();
+      return sTrimmed.Find(sConfigStartMarker) == 0 ? TLineRole::kMarker : TLineRole::kOther;
+    }
+    default:
+      return TLineRole::kOther;
+  }
+}
+
+}  // namespace
+
+std::vector<TConfigurationDiagnostic> readProgramConfiguration(CRobotConfigurationBasic &config,
+                                                               const CProgramText &program) {
+  std::vector<TConfigurationDiagnostic> diagnostics;
+  config.clearConfigurationDefinition();
+  config.initializeMultiRobotNetworkDefinitionBeforeParsingConfiguration();
+  CString sPath;
+  config.getPathName(sPath);
+  TTokenizedConfigParms parms;
+  CString sError;
+  for (size_t i = 0; i < program.lines().size(); ++i) {
+    bool bCut = false;
+    const CString sLine = program.lineString(i);
+    if (CRobotConfigurationBasic::nTokenizeLineReportingCuts(sLine, parms, bCut) != lineTypeConfigPragma) continue;
+    const int nLine = static_cast<int>(i) + 1;
+    sError.Empty();
+    // The record keeps only what the tokens hold; a rewritten block would drop the rest.
+    const bool bLineTooLong = program.lineText(i).size() > CProgramText::kMaxDecodedLineBytes;
+    if (bCut || bLineTooLong) {
+      CString sMessage;
+      sMessage.Format(L"'%s' configuration line holds more than is kept (at most 12 parameters of 99 characters)",
+                      parms.sParms[0]);
+      diagnostics.push_back({nLine, sMessage});
+    }
+    if (config.bParseConfigDefinitionLine(parms, true, TLineNumber(nLine, 0), sPath, sError)) continue;
+    if (sError.IsEmpty()) sError.Format(L"'%s' configuration line rejected", parms.sParms[0]);
+    diagnostics.push_back({nLine, sError});
+  }
+  config.normalizeValuesAfterParsingConfiguration();
+  config.validateMultiRobotNetworkDefinitionAfterParsingConfiguration();
+  // The IDE follows the board the program names, then checks the port rules.
+  config.modifyBoardTypeIfDifferentFromIDESetting();
+  config.checkEngineeringRules(true);
+  return diagnostics;
+}
+
+bool generateSettledBlock(CHostRobotConfiguration &config, CString &sBlock,
+                          std::vector<TConfigurationDiagnostic> *pRefused) {
+  config.buildSourceCodeForConfiguration(sBlock, false);
+  CString sPath;
+  config.getPathName(sPath);
+  // Two rounds settle every case the rules allow; more would mean a fault.
+  constexpr int kMaxRounds = 4;
+  for (int nRound = 0; nRound < kMaxRounds; ++nRound) {
+    // Reading again must neither move the IDE's board nor repeat the warnings.
+    CHostSelectionScope selection;
+    CCapturingMessageSink quiet;
+    CHostRobotConfiguration reread;
+    reread.setPathName(sPath);
+    std::vector<TConfigurationDiagnostic> refused = readProgramConfiguration(reread, CProgramText(sBlock.toUtf8()));
+    if (!refused.empty()) {
+      if (pRefused) *pRefused = std::move(refused);
+      return false;
+    }
+    CString sAgain;
+    reread.buildSourceCodeForConfiguration(sAgain, false);
+    if (sAgain == sBlock) return true;
+    sBlock = sAgain;
+  }
+  return false;
+}
+
+std::string encodeGeneratedBlock(const CString &sGenerated, const char *pzLineEnding) {
+  CString sText(sGenerated);
+  sText.Replace(L"\r\n", L"\n");
+  std::string sBytes = sText.toUtf8();
+  if (std::string_view(pzLineEnding) == "\n") return sBytes;
+  std::string sOut;
+  sOut.reserve(sBytes.size() + sBytes.size() / 32);
+  for (char c : sBytes) {
+    if (c == '\n') sOut += pzLineEnding;
+    else sOut += c;
+  }
+  return sOut;
+}
+
+std::string replaceConfigurationBlock(const CProgramText &program, const CString &sGenerated) {
+  const size_t nLines = program.lines().size();
+  std::vector<TLineRole> roles(nLines);
+  for (size_t i = 0; i < nLines; ++i) roles[i] = lineRole(program.lineString(i));
+
+  // Lines that belong to the block: every configuration line, and the first
+  // marker line after the block's start together with one blank line after it.
+  std::vector<bool> bRemove(nLines, false);
+  size_t nBlockStart = nLines;
+  bool bMarkerTaken = false;
+  for (size_t i = 0; i < nLines; ++i) {
+    if (roles[i] == TLineRole::kConfig) {
+      bRemove[i] = true;
+      nBlockStart = std::min(nBlockStart, i);
+    } else if (roles[i] == TLineRole::kMarker && !bMarkerTaken) {
+      bMarkerTaken = true;
+      bRemove[i] = true;
+      nBlockStart = std::min(nBlockStart, i);
+      if (i + 1 < nLines && roles[i + 1] == TLineRole::kBlank) bRemove[i + 1] = true;
+    }
+  }
+  // Blank lines between configuration lines and their marker go with the block.
+  for (size_t i = nBlockStart; i < nLines; ++i) {
+    if (roles[i] != TLineRole::kBlank || bRemove[i]) continue;
+    size_t j = i;
+    while (j < nLines && roles[j] == TLineRole::kBlank && !bRemove[j]) ++j;
+    if (j < nLines && bRemove[j] && j > i && (roles[j] == TLineRole::kConfig || roles[j] == TLineRole::kMarker) &&
+        bRemove[i - 1])
+      std::fill(bRemove.begin() + long(i), bRemove.begin() + long(j), true);
+    i = j;
+  }
+
+  const bool bHadBlock = nBlockStart < nLines;
+  std::string sBlock = encodeGeneratedBlock(sGenerated, program.lineEnding());
+  if (sBlock.empty()) {
+    if (!bHadBlock) return program.bytes();
+    // An emptied block keeps its place with the empty-block marker.
+    sBlock = CString(sConfigEmptyBlockMarker).toUtf8() + program.lineEnding() + program.lineEnding();
+  }
+
+  std::string sOut(program.byteOrderMark());
+  sOut.reserve(program.bytes().size() + sBlock.size());
+  if (!bHadBlock) sOut += sBlock;
+  for (size_t i = 0; i < nLines; ++i) {
+    if (i == nBlockStart) sOut += sBlock;
+    if (bRemove[i]) continue;
+    const CProgramText::TLine &line = program.lines()[i];
+    sOut.append(program.bytes(), line.nOffset, line.nLength + line.nEolLength);
+  }
+  return sOut;
+}
