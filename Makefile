@@ -6,7 +6,7 @@ GENERATOR := $(shell command -v ninja >/dev/null 2>&1 && echo "-G Ninja")
 JOBS ?= $(shell nproc 2>/dev/null || echo 2)
 ROBOTCFG = ./$(BUILD_DIR)/robotcfg
 
-.PHONY: all build demo test asan-test ci clean deps goldens coverage fuzz
+.PHONY: all build demo test asan-test ci clean deps goldens coverage fuzz bench
 
 all: build
 
@@ -69,6 +69,16 @@ fuzz:
 	    grep -E '^(stat::number_of_executed_units|stat::average_exec_per_sec|==[0-9]+==|SUMMARY|Done)' || true; \
 	  if ls $(FUZZ_BUILD_DIR)/$$name-* >/dev/null 2>&1; then echo "$$name found a failing input"; exit 1; fi; \
 	done
+
+# The benchmarks (Google Benchmark), then the 10,000-program corpus timed against grep.
+BENCH_BUILD_DIR ?= build-bench
+bench:
+	@[ -e /usr/include/benchmark/benchmark.h ] || ./.ci/install-deps bench
+	@$(CMAKE) -S . -B $(BENCH_BUILD_DIR) $(GENERATOR) -DCMAKE_BUILD_TYPE=RelWithDebInfo -DROBOTCONFIG_BUILD_BENCH=ON \
+	  -DROBOTCONFIG_BUILD_TESTS=OFF $(CMAKE_ARGS) >/dev/null
+	$(CMAKE) --build $(BENCH_BUILD_DIR) -j $(JOBS)
+	$(BENCH_BUILD_DIR)/bench/robotconfig_bench $(BENCH_ARGS)
+	bench/corpus_bench.sh $(BENCH_BUILD_DIR)/robotcfg
 
 ci:
 	./.ci/run

@@ -10,9 +10,9 @@ namespace {
 
 // The configuration block the record generates.
 // The settled block of a program's configuration; false (after saying so) when it does not settle.
-bool settledBlock(const std::string &sPath, CHostRobotConfiguration &config, CString &sBlock) {
+bool settledBlock(const std::string &sPath, const TReadProgram &program, CString &sBlock) {
   std::vector<TConfigurationDiagnostic> refused;
-  if (generateSettledBlock(config, sBlock, &refused)) return true;
+  if (generateSettledBlock(*program.pConfig, sBlock, &refused, program.pText.get())) return true;
   if (refused.empty()) {
     std::fprintf(stderr, "%s: error: the configuration block does not settle when it is regenerated\n",
                  displayName(sPath).c_str());
@@ -70,17 +70,19 @@ int runFormat(const TOptions &options) {
       continue;
     }
     CString sBlock;
-    if (!settledBlock(sPath, *program.pConfig, sBlock)) {
+    if (!settledBlock(sPath, program, sBlock)) {
       fail(kExitRejected);
       continue;
     }
-    const std::string sFormatted = replaceConfigurationBlock(*program.pText, sBlock);
     if (options.bCheckOnly) {
-      if (sFormatted != program.pText->bytes()) {
+      if (!programHoldsBlock(*program.pText, sBlock)) {
         std::fprintf(stderr, "%s: configuration block is not in generated form\n", displayName(sPath).c_str());
         fail(kExitRejected);
       }
-    } else if (options.bInPlace) {
+      continue;
+    }
+    const std::string sFormatted = replaceConfigurationBlock(*program.pText, sBlock);
+    if (options.bInPlace) {
       std::string sError;
       if (sFormatted != program.pText->bytes() && !writeFileAtomically(sPath, sFormatted, sError)) {
         std::fprintf(stderr, "robotcfg: %s\n", sError.c_str());
@@ -99,7 +101,7 @@ int runGenerate(const TOptions &options) {
   if (!readProgramNotingBoard(sPath, program)) return kExitUsage;
   if (reportDiagnostics(sPath, program)) return kExitRejected;
   CString sBlock;
-  if (!settledBlock(sPath, *program.pConfig, sBlock)) return kExitRejected;
+  if (!settledBlock(sPath, program, sBlock)) return kExitRejected;
   writeStdout(encodeGeneratedBlock(sBlock, program.pText->lineEnding()));
   return kExitOk;
 }

@@ -16,6 +16,7 @@ bool formatProgram(const std::string &sBytes, std::string &sOut) {
   CString sBlock;
   if (!bSettles(config, sBlock)) return false;
   sOut = replaceConfigurationBlock(program, sBlock);
+  fuzzCheck(programHoldsBlock(program, sBlock) == (sOut == sBytes), "the block check agrees with the replaced text");
   return true;
 }
 

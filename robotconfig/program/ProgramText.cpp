@@ -38,6 +38,16 @@ namespace {
 // What a line is to the block finder.
 enum class TLineRole { kOther, kBlank, kConfig, kMarker };
 
+// True when a line's bytes may hold a configuration line: only one whose
+// first token is "#pragma" (quoted or not) can, so most lines are passed
+// over without being decoded.
+bool mayBeConfigLine(std::string_view line) {
+  size_t pos = 0;
+  while (pos < line.size() && (line[pos] == ' ' || line[pos] == '\t')) ++pos;
+  if (pos < line.size() && line[pos] == '"') ++pos;
+  return line.compare(pos, 7, "#pragma") == 0;
+}
+
 // The role of one line: configuration lines and the marker lines that close a
 // block are part of it; so are blank lines inside it.
 TLineRole lineRole(const CString &sLine) {
@@ -60,6 +70,65 @@ TLineRole lineRole(const CString &sLine) {
   }
 }
 
+// The role of line `nIndex`, decoding it only when its bytes could make it
+// more than an ordinary line: blank lines hold only blanks, and every other
+// role needs "#pragma" first or the marker somewhere.
+TLineRole lineRole(const CProgramText &program, size_t nIndex) {
+  const std::string_view line = program.lineText(nIndex);
+  if (line.find_first_not_of(" \t") == std::string_view::npos) return TLineRole::kBlank;
+  if (!mayBeConfigLine(line) && line.find("//*!!") == std::string_view::npos) return TLineRole::kOther;
+  return lineRole(program.lineString(nIndex));
+}
+
+// Which lines the block takes and where it starts.
+struct TBlockPlan {
+  std::vector<bool> bRemove;
+  size_t nBlockStart;  ///< the line the block is written at; the line count when there is no block
+};
+
+// The block of `program`: every configuration line, and the first marker line
+// after the block's start together with one blank line after it.
+TBlockPlan planBlock(const CProgramText &program) {
+  const size_t nLines = program.lines().size();
+  std::vector<TLineRole> roles(nLines);
+  for (size_t i = 0; i < nLines; ++i) roles[i] = lineRole(program, i);
+
+  std::vector<bool> bRemove(nLines, false);
+  size_t nBlockStart = nLines;
+  bool bMarkerTaken = false;
+  for (size_t i = 0; i < nLines; ++i) {
+    if (roles[i] == TLineRole::kConfig) {
+      bRemove[i] = true;
+      nBlockStart = std::min(nBlockStart, i);
+    } else if (roles[i] == TLineRole::kMarker && !bMarkerTaken) {
+      bMarkerTaken = true;
+      bRemove[i] = true;
+      nBlockStart = std::min(nBlockStart, i);
+      if (i + 1 < nLines && roles[i + 1] == TLineRole::kBlank) bRemove[i + 1] = true;
+    }
+  }
+  // Blank lines between configuration lines and their marker go with the block.
+  for (size_t i = nBlockStart; i < nLines; ++i) {
+    if (roles[i] != TLineRole::kBlank || bRemove[i]) continue;
+    size_t j = i;
+    while (j < nLines && roles[j] == TLineRole::kBlank && !bRemove[j]) ++j;
+    if (j < nLines && bRemove[j] && j > i && (roles[j] == TLineRole::kConfig || roles[j] == TLineRole::kMarker) &&
+        bRemove[i - 1])
+      std::fill(bRemove.begin() + long(i), bRemove.begin() + long(j), true);
+    i = j;
+  }
+  return {std::move(bRemove), nBlockStart};
+}
+
+// The bytes written in the block's place; empty when the program stays as it is
+// (an empty text for a program without a block).
+std::string blockBytes(const CProgramText &program, const CString &sGenerated, bool bHadBlock) {
+  std::string sBlock = encodeGeneratedBlock(sGenerated, program.lineEnding());
+  if (sBlock.empty() && bHadBlock)  // an emptied block keeps its place with the empty-block marker
+    sBlock = CString(sConfigEmptyBlockMarker).toUtf8() + program.lineEnding() + program.lineEnding();
+  return sBlock;
+}
+
 }  // namespace
 
 std::vector<TConfigurationDiagnostic> readProgramConfiguration(CRobotConfigurationBasic &config,
@@ -72,6 +141,7 @@ std::vector<TConfigurationDiagnostic> readProgramConfiguration(CRobotConfigurati
   TTokenizedConfigParms parms;
   CString sError;
   for (size_t i = 0; i < program.lines().size(); ++i) {
+    if (!mayBeConfigLine(program.lineText(i))) continue;
     bool bCut = false;
     const CString sLine = program.lineString(i);
     if (CRobotConfigurationBasic::nTokenizeLineReportingCuts(sLine, parms, bCut) != lineTypeConfigPragma) continue;
@@ -98,8 +168,10 @@ std::vector<TConfigurationDiagnostic> readProgramConfiguration(CRobotConfigurati
 }
 
 bool generateSettledBlock(CHostRobotConfiguration &config, CString &sBlock,
-                          std::vector<TConfigurationDiagnostic> *pRefused) {
+                          std::vector<TConfigurationDiagnostic> *pRefused, const CProgramText *pProgram) {
   config.buildSourceCodeForConfiguration(sBlock, false);
+  // The program's own lines read back into this very record, so its block is settled.
+  if (pProgram && programHoldsBlock(*pProgram, sBlock)) return true;
   CString sPath;
   config.getPathName(sPath);
   // Two rounds settle every case the rules allow; more would mean a fault.
@@ -138,53 +210,44 @@ std::string encodeGeneratedBlock(const CString &sGenerated, const char *pzLineEn
 }
 
 std::string replaceConfigurationBlock(const CProgramText &program, const CString &sGenerated) {
+  const TBlockPlan plan = planBlock(program);
   const size_t nLines = program.lines().size();
-  std::vector<TLineRole> roles(nLines);
-  for (size_t i = 0; i < nLines; ++i) roles[i] = lineRole(program.lineString(i));
-
-  // Lines that belong to the block: every configuration line, and the first
-  // marker line after the block's start together with one blank line after it.
-  std::vector<bool> bRemove(nLines, false);
-  size_t nBlockStart = nLines;
-  bool bMarkerTaken = false;
-  for (size_t i = 0; i < nLines; ++i) {
-    if (roles[i] == TLineRole::kConfig) {
-      bRemove[i] = true;
-      nBlockStart = std::min(nBlockStart, i);
-    } else if (roles[i] == TLineRole::kMarker && !bMarkerTaken) {
-      bMarkerTaken = true;
-      bRemove[i] = true;
-      nBlockStart = std::min(nBlockStart, i);
-      if (i + 1 < nLines && roles[i + 1] == TLineRole::kBlank) bRemove[i + 1] = true;
-    }
-  }
-  // Blank lines between configuration lines and their marker go with the block.
-  for (size_t i = nBlockStart; i < nLines; ++i) {
-    if (roles[i] != TLineRole::kBlank || bRemove[i]) continue;
-    size_t j = i;
-    while (j < nLines && roles[j] == TLineRole::kBlank && !bRemove[j]) ++j;
-    if (j < nLines && bRemove[j] && j > i && (roles[j] == TLineRole::kConfig || roles[j] == TLineRole::kMarker) &&
-        bRemove[i - 1])
-      std::fill(bRemove.begin() + long(i), bRemove.begin() + long(j), true);
-    i = j;
-  }
-
-  const bool bHadBlock = nBlockStart < nLines;
-  std::string sBlock = encodeGeneratedBlock(sGenerated, program.lineEnding());
-  if (sBlock.empty()) {
-    if (!bHadBlock) return program.bytes();
-    // An emptied block keeps its place with the empty-block marker.
-    sBlock = CString(sConfigEmptyBlockMarker).toUtf8() + program.lineEnding() + program.lineEnding();
-  }
+  const bool bHadBlock = plan.nBlockStart < nLines;
+  const std::string sBlock = blockBytes(program, sGenerated, bHadBlock);
+  if (sBlock.empty() && !bHadBlock) return program.bytes();
 
   std::string sOut(program.byteOrderMark());
   sOut.reserve(program.bytes().size() + sBlock.size());
   if (!bHadBlock) sOut += sBlock;
   for (size_t i = 0; i < nLines; ++i) {
-    if (i == nBlockStart) sOut += sBlock;
-    if (bRemove[i]) continue;
+    if (i == plan.nBlockStart) sOut += sBlock;
+    if (plan.bRemove[i]) continue;
     const CProgramText::TLine &line = program.lines()[i];
     sOut.append(program.bytes(), line.nOffset, line.nLength + line.nEolLength);
   }
   return sOut;
+}
+
+bool programHoldsBlock(const CProgramText &program, const CString &sGenerated) {
+  const TBlockPlan plan = planBlock(program);
+  const size_t nLines = program.lines().size();
+  const bool bHadBlock = plan.nBlockStart < nLines;
+  const std::string sBlock = blockBytes(program, sGenerated, bHadBlock);
+  if (sBlock.empty() && !bHadBlock) return true;
+  if (!bHadBlock) return false;
+  // The replaced text keeps every line before the block, so it equals the
+  // program exactly when the block's bytes stand where the block starts and
+  // every line from there on is either kept or part of those bytes.
+  const std::string &sBytes = program.bytes();
+  size_t nAt = program.lines()[plan.nBlockStart].nOffset;
+  if (sBytes.compare(nAt, sBlock.size(), sBlock) != 0) return false;
+  nAt += sBlock.size();
+  for (size_t i = plan.nBlockStart; i < nLines; ++i) {
+    if (plan.bRemove[i]) continue;
+    const CProgramText::TLine &line = program.lines()[i];
+    const size_t nSize = line.nLength + line.nEolLength;
+    if (sBytes.compare(nAt, nSize, sBytes, line.nOffset, nSize) != 0) return false;
+    nAt += nSize;
+  }
+  return nAt == sBytes.size();
 }

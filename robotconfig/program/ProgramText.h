@@ -66,6 +66,9 @@ std::vector<TConfigurationDiagnostic> readProgramConfiguration(CRobotConfigurati
 /// nothing in a program without one.
 std::string replaceConfigurationBlock(const CProgramText &program, const CString &sGenerated);
 
+/// True when replacing the program's block by `sGenerated` would change no byte.
+bool programHoldsBlock(const CProgramText &program, const CString &sGenerated);
+
 class CHostRobotConfiguration;
 
 /// The block `config` generates, settled: a few rules make the first block of
@@ -74,8 +77,12 @@ class CHostRobotConfiguration;
 /// back and regenerated until it no longer changes. False when it does not
 /// settle within a few rounds; `sBlock` then holds the last block and
 /// `pRefused`, when given, the lines of it that did not read back.
+/// `pProgram`, when given, is the program `config` was read from (starting
+/// from the same board): when it already holds the first block, that block
+/// is settled without reading it back.
 bool generateSettledBlock(CHostRobotConfiguration &config, CString &sBlock,
-                          std::vector<TConfigurationDiagnostic> *pRefused = nullptr);
+                          std::vector<TConfigurationDiagnostic> *pRefused = nullptr,
+                          const CProgramText *pProgram = nullptr);
 
 /// `sGenerated` with "\r\n" line ends turned into the program's line ending.
 std::string encodeGeneratedBlock(const CString &sGenerated, const char *pzLineEnding);
