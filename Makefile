@@ -94,3 +94,7 @@ goldens: build
 	  $(ROBOTCFG) check $$opts $${dir}program.c 2> $${dir}expected-check.txt || true; \
 	  $(ROBOTCFG) format $$opts $${dir}program.c > $${dir}expected-format.c 2>/dev/null || true; \
 	done
+	@for file in tests/mistakes/*.c; do \
+	  opts=$$(sed -n '1s|^// options:||p' $$file); \
+	  $(ROBOTCFG) check $$opts $$file 2> $${file%.c}.expected || true; \
+	done

@@ -2,6 +2,7 @@
 
 #include <cstdio>
 
+#include "cli/CheckReport.h"
 #include "cli/ReadProgram.h"
 #include "robotconfig/program/FileIO.h"
 #include "robotconfig/host/Platform.h"
@@ -40,18 +41,7 @@ bool readProgramNotingBoard(const std::string &sPath, TReadProgram &program) {
 
 }  // namespace
 
-int runCheck(const TOptions &options) {
-  int nStatus = kExitOk;
-  for (const std::string &sPath : options.files) {
-    TReadProgram program;
-    if (!readProgramNotingBoard(sPath, program)) {
-      nStatus = kExitUsage;
-      continue;
-    }
-    if (reportDiagnostics(sPath, program) && nStatus == kExitOk) nStatus = kExitRejected;
-  }
-  return nStatus;
-}
+int runCheck(const TOptions &options) { return runCheckCommand(options); }
 
 int runFormat(const TOptions &options) {
   int nStatus = kExitOk;
@@ -60,12 +50,14 @@ int runFormat(const TOptions &options) {
   };
   for (const std::string &sPath : options.files) {
     TReadProgram program;
-    if (!readProgramNotingBoard(sPath, program)) {
+    TFileFindings findings;
+    if (!readAndCheckProgram(sPath, options, program, findings)) {
       fail(kExitUsage);
       continue;
     }
-    // A line the record could not read would be lost by regenerating the block.
-    if (reportDiagnostics(sPath, program)) {
+    printFindingsText(findings, options);
+    // A line the checker finds wrong would be lost or changed by regenerating the block.
+    if (bHasErrors(findings)) {
       fail(kExitRejected);
       continue;
     }

@@ -44,7 +44,7 @@ const char *usageText() {
          "Reads, checks and rewrites the '#pragma config(...)' block of robot programs.\n"
          "\n"
          "commands:\n"
-         "  check FILE...      report every rejected configuration line as FILE:LINE: error: MESSAGE\n"
+         "  check FILE...      report mistakes as FILE:LINE:COL: error: MESSAGE [CODE] (see docs/DIAGNOSTICS.md)\n"
          "  format FILE...     print each program with its configuration block regenerated\n"
          "  generate FILE      print only the regenerated configuration block\n"
          "  show [FILE]        print the configuration (of FILE, or the empty one) as port tables\n"
@@ -62,6 +62,10 @@ const char *usageText() {
          "  -i, --in-place           format: rewrite the files instead of printing them\n"
          "  --check                  format: change nothing; exit 1 when a block is not in generated form\n"
          "  -v, --verbose            diff: list the devices that differ\n"
+         "  --format text|json|sarif check: how findings are reported (json and sarif on stdout)\n"
+         "  --Werror                 check, format: treat warnings as errors\n"
+         "  -q, --quiet              check, format: report errors only\n"
+         "  --show-source            show the offending line under each finding (default on a terminal)\n"
          "  -o, --output OUT         save-model: the model file to write\n"
          "  -h, --help               show this help\n"
          "  --version                show the version\n"
@@ -126,6 +130,16 @@ bool parseOptions(int argc, char **argv, TOptions &options, std::string &sError)
       else if (sArg == "-o" || sArg == "--output") {
         if (!takeValue(options.sOutputPath)) return false;
       }
+      else if (sArg == "--Werror") options.bWarningsAreErrors = true;
+      else if (sArg == "-q" || sArg == "--quiet") options.bQuiet = true;
+      else if (sArg == "--show-source") options.bShowSource = true;
+      else if (sArg == "--format") {
+        if (!takeValue(options.sReportFormat)) return false;
+        if (options.sReportFormat != "text" && options.sReportFormat != "json" && options.sReportFormat != "sarif") {
+          sError = "unknown report format '" + options.sReportFormat + "' (text, json or sarif)";
+          return false;
+        }
+      }
       else if (sArg == "--external-controllers") options.bExternalControllers = true;
       else if (sArg == "--platform") {
         if (!takeValue(sPlatform)) return false;
@@ -137,7 +151,8 @@ bool parseOptions(int argc, char **argv, TOptions &options, std::string &sError)
         sError = "unknown option '" + sArg + "'";
         return false;
       }
-      if (bHasValue && sArg != "--platform" && sArg != "--board" && sArg != "--output") {
+      if (bHasValue && sArg != "--platform" && sArg != "--board" && sArg != "--output" &&
+          sArg != "--format") {
         sError = "option '" + sArg + "' takes no value";
         return false;
       }
@@ -223,6 +238,10 @@ bool parseOptions(int argc, char **argv, TOptions &options, std::string &sError)
   }
   if ((options.bInPlace || options.bCheckOnly) && options.nCommand != TCommand::kFormat) {
     sError = "-i and --check apply to the format command only";
+    return false;
+  }
+  if (options.sReportFormat != "text" && options.nCommand != TCommand::kCheck) {
+    sError = "--format applies to the check command only";
     return false;
   }
   if (options.bInPlace && options.bCheckOnly) {

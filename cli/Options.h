@@ -18,6 +18,10 @@ struct TOptions {
   bool bCheckOnly = false;  ///< format --check
   bool bVerbose = false;    ///< diff -v
   std::string sOutputPath;  ///< save-model -o
+  bool bWarningsAreErrors = false;  ///< --Werror
+  bool bQuiet = false;              ///< -q: errors only
+  std::string sReportFormat = "text";  ///< check --format: text, json or sarif
+  bool bShowSource = false;         ///< --show-source: caret excerpts even when not on a terminal
   bool bHelp = false;
   bool bVersion = false;
 };

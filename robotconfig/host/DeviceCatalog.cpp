@@ -127,6 +127,11 @@ const wchar_t *getSensorSecondaryPort(int nSecondary) {
   return findKeywordOfValue(kSecondaryPortNames, nSecondary, kAnyRow);
 }
 
+const TDeviceTypeMenuItem *getMotorTypeNameTable() { return kMotorTypeNames; }
+const TDeviceTypeMenuItem *getSensorTypeNameTable() { return kSensorTypeNames; }
+const TDeviceTypeMenuItem *getSensorModeNameTable() { return kSensorModeNames; }
+const TDeviceTypeMenuItem *getServoTypeNameTable() { return kServoTypeNames; }
+
 int getInteger(const CString &sText, bool &bOk) {
   bOk = false;
   const int nLength = sText.GetLength();

@@ -72,6 +72,14 @@ int getSecondaryPortIndex(const CString &sText);
 /// Keyword of a secondary-port value; "" for -1 and unknown values.
 const wchar_t *getSensorSecondaryPort(int nSecondary);
 
+/// The name tables behind the lookups above, rows of every platform (a row's
+/// mask tells where it applies), for menus and checkers that list the words.
+const TDeviceTypeMenuItem *getMotorTypeNameTable();
+const TDeviceTypeMenuItem *getSensorTypeNameTable();
+/// Sensor modes of every type; getSensorModeIndex tells which belong to a type.
+const TDeviceTypeMenuItem *getSensorModeNameTable();
+const TDeviceTypeMenuItem *getServoTypeNameTable();
+
 /// Decimal value of the text (optional sign, blanks around allowed);
 /// `bOk` is false, and the result 0, when the text is no number or overflows.
 int getInteger(const CString &sText, bool &bOk);

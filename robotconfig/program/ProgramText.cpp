@@ -132,7 +132,8 @@ std::string blockBytes(const CProgramText &program, const CString &sGenerated, b
 }  // namespace
 
 std::vector<TConfigurationDiagnostic> readProgramConfiguration(CRobotConfigurationBasic &config,
-                                                               const CProgramText &program) {
+                                                               const CProgramText &program,
+                                                               CReadingObserver *pObserver) {
   std::vector<TConfigurationDiagnostic> diagnostics;
   config.clearConfigurationDefinition();
   config.initializeMultiRobotNetworkDefinitionBeforeParsingConfiguration();
@@ -155,10 +156,14 @@ std::vector<TConfigurationDiagnostic> readProgramConfiguration(CRobotConfigurati
                       parms.sParms[0]);
       diagnostics.push_back({nLine, sMessage});
     }
-    if (config.bParseConfigDefinitionLine(parms, true, TLineNumber(nLine, 0), sPath, sError)) continue;
+    if (pObserver) pObserver->beforeLine(nLine, parms);
+    const bool bAccepted = config.bParseConfigDefinitionLine(parms, true, TLineNumber(nLine, 0), sPath, sError);
+    if (pObserver) pObserver->afterLine(nLine, parms, bAccepted);
+    if (bAccepted) continue;
     if (sError.IsEmpty()) sError.Format(L"'%s' configuration line rejected", parms.sParms[0]);
     diagnostics.push_back({nLine, sError});
   }
+  if (pObserver) pObserver->beforeAfterReadingSteps();
   config.normalizeValuesAfterParsingConfiguration();
   config.validateMultiRobotNetworkDefinitionAfterParsingConfiguration();
   // The IDE follows the board the program names, then checks the port rules.

@@ -51,11 +51,27 @@ struct TConfigurationDiagnostic {
   CString sMessage;  ///< the reader's message (a generic text when it gave none)
 };
 
+/// Watches the reading road line by line: a checker sees the record just
+/// before and just after each configuration line is read.
+class CReadingObserver {
+ public:
+  virtual ~CReadingObserver() = default;
+  /// Before the dispatcher reads configuration line `nLine` (1-based).
+  virtual void beforeLine(int nLine, const TTokenizedConfigParms &parms) = 0;
+  /// After it; `bAccepted` is false when the line was refused (the refusal
+  /// is in the returned diagnostics).
+  virtual void afterLine(int nLine, const TTokenizedConfigParms &parms, bool bAccepted) = 0;
+  /// After the last line, before the after-reading steps.
+  virtual void beforeAfterReadingSteps() {}
+};
+
 /// Reads a program's configuration into `config`: clears it, then hands every
 /// configuration line in order to the line dispatcher, then runs the
-/// after-reading steps. Returns the refused lines.
+/// after-reading steps. Returns the refused lines. `pObserver`, when given,
+/// watches each line.
 std::vector<TConfigurationDiagnostic> readProgramConfiguration(CRobotConfigurationBasic &config,
-                                                               const CProgramText &program);
+                                                               const CProgramText &program,
+                                                               CReadingObserver *pObserver = nullptr);
 
 /// The program with its configuration block replaced by `sGenerated` (the
 /// generator's text, lines ending in "\r\n"), written with the program's own

@@ -1,0 +1,82 @@
+#include "cli/CheckReport.h"
+
+#include <unistd.h>
+
+#include <cstdio>
+#include <memory>
+
+#include "cli/Commands.h"
+#include "robotconfig/checker/ProgramChecker.h"
+#include "robotconfig/host/Platform.h"
+#include "robotconfig/program/FileIO.h"
+
+#ifndef ROBOTCONFIG_VERSION
+#define ROBOTCONFIG_VERSION "0.1.0"
+#endif
+
+bool readAndCheckProgram(const std::string &sPath, const TOptions &options, TReadProgram &program,
+                         TFileFindings &findings) {
+  // Every file starts from the command line's board, whatever board an earlier one named.
+  CHostSelectionScope scope;
+  std::string sBytes, sError;
+  if (!readProgramFile(sPath, sBytes, sError)) {
+    std::fprintf(stderr, "robotcfg: %s\n", sError.c_str());
+    return false;
+  }
+  program.pText = std::make_unique<CProgramText>(std::move(sBytes));
+  program.pConfig = std::make_unique<CHostRobotConfiguration>();
+  program.pConfig->setPathName(CString::fromUtf8(sPath));
+  TCheckOptions checkOptions;
+  checkOptions.bBoardChosen = options.nBoard >= 0;
+  TCheckResult result = checkProgram(*program.pConfig, *program.pText, checkOptions);
+  program.diagnostics = std::move(result.refused);
+  findings.sFile = displayName(sPath);
+  findings.pProgram = program.pText.get();
+  findings.findings = std::move(result.findings);
+  if (options.bWarningsAreErrors)
+    for (TFinding &finding : findings.findings)
+      if (finding.nSeverity == TSeverity::kWarning) finding.nSeverity = TSeverity::kError;
+  return true;
+}
+
+bool bHasErrors(const TFileFindings &findings) {
+  for (const TFinding &finding : findings.findings)
+    if (finding.nSeverity == TSeverity::kError) return true;
+  return false;
+}
+
+void printFindingsText(const TFileFindings &findings, const TOptions &options) {
+  TTextOptions textOptions;
+  // A caret excerpt helps a person at a terminal; logs and pipes get plain lines.
+  textOptions.bShowSource = options.bShowSource || isatty(STDERR_FILENO);
+  textOptions.bErrorsOnly = options.bQuiet;
+  const std::string sText = renderText(findings, textOptions);
+  std::fwrite(sText.data(), 1, sText.size(), stderr);
+}
+
+int runCheckCommand(const TOptions &options) {
+  int nStatus = kExitOk;
+  std::vector<TReadProgram> programs(options.files.size());
+  std::vector<TFileFindings> reports;
+  for (size_t i = 0; i < options.files.size(); ++i) {
+    TFileFindings findings;
+    if (!readAndCheckProgram(options.files[i], options, programs[i], findings)) {
+      nStatus = kExitUsage;
+      continue;
+    }
+    if (bHasErrors(findings) && nStatus == kExitOk) nStatus = kExitRejected;
+    if (options.sReportFormat == "text") printFindingsText(findings, options);
+    if (options.bQuiet) {
+      std::vector<TFinding> kept;
+      for (TFinding &finding : findings.findings)
+        if (finding.nSeverity == TSeverity::kError) kept.push_back(std::move(finding));
+      findings.findings = std::move(kept);
+    }
+    reports.push_back(std::move(findings));
+  }
+  std::string sDocument;
+  if (options.sReportFormat == "json") sDocument = renderJson(reports);
+  if (options.sReportFormat == "sarif") sDocument = renderSarif(reports, ROBOTCONFIG_VERSION);
+  std::fwrite(sDocument.data(), 1, sDocument.size(), stdout);
+  return nStatus;
+}
