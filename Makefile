@@ -6,19 +6,23 @@ GENERATOR := $(shell command -v ninja >/dev/null 2>&1 && echo "-G Ninja")
 JOBS ?= $(shell nproc 2>/dev/null || echo 2)
 ROBOTCFG = ./$(BUILD_DIR)/robotcfg
 
-.PHONY: all build demo test asan-test ci clean deps goldens coverage fuzz bench
+.PHONY: all configure build demo test asan-test ci clean deps goldens coverage fuzz bench
 
 all: build
 
+# Installs what is missing on a Debian machine (apt-get, through sudo when not root).
 deps:
 	@./.ci/install-deps
 
-build:
+configure: deps
 	@$(CMAKE) -S . -B $(BUILD_DIR) $(GENERATOR) -DCMAKE_BUILD_TYPE=RelWithDebInfo $(CMAKE_ARGS) >/dev/null
+
+build: configure
 	$(CMAKE) --build $(BUILD_DIR) -j $(JOBS)
 
-# Runs the tool on every bundled example program.
-demo: build
+# Builds only the tool, then runs it on every bundled example program.
+demo: configure
+	$(CMAKE) --build $(BUILD_DIR) -j $(JOBS) --target robotcfg
 	@set -e; for dir in examples/*/; do \
 	  opts=$$(cat $$dir/options); \
 	  echo "== robotcfg check $$opts $${dir}program.c"; \

@@ -1,3 +1,4 @@
+// Layer record (core/, motors/, sensors/, drive_serial_network/): built on host/ alone.
 // The robot configuration of one user program: every motor, sensor, servo,
 // hub, serial port, board, drive-train, memory and network setting that the
 // program's "#pragma config(...)" block describes, how that block is read

@@ -1,3 +1,4 @@
+// Layer record (with core/, motors/, sensors/): built on host/ alone.
 // UART and I2C ports: default uses and the words of their configuration lines.
 #pragma once
 

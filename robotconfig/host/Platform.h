@@ -1,3 +1,4 @@
+// Layer host, the lowest: services the record calls; includes nothing of robotconfig/ above host/.
 // Platform, board and toggle services: what the configuration rules ask of
 // the host about the current platform, its boards and its feature toggles.
 #pragma once

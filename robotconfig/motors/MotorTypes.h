@@ -1,3 +1,4 @@
+// Layer record (with core/, sensors/, drive_serial_network/): built on host/ alone.
 // Motor types: which exist on the current platform, their default flags,
 // and the replacement of types a platform lacks.
 #pragma once

@@ -1,3 +1,4 @@
+// Layer program: built on the record and host/; the checker and the model build on it.
 // The host's two roads through a program's text: reading its configuration
 // lines into a record, and putting a regenerated configuration block back
 // into the program with every other byte kept as it was.

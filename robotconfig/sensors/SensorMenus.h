@@ -1,3 +1,4 @@
+// Layer record (with core/, motors/, drive_serial_network/): built on host/ alone.
 // What the setup dialogs' menus need from the sensor side of the library: the
 // drive-side menu, the sensor-port menu of the configuration's board and the
 // default mode of a sensor type.
