@@ -6,7 +6,7 @@ GENERATOR := $(shell command -v ninja >/dev/null 2>&1 && echo "-G Ninja")
 JOBS ?= $(shell nproc 2>/dev/null || echo 2)
 ROBOTCFG = ./$(BUILD_DIR)/robotcfg
 
-.PHONY: all configure build demo test asan-test ci clean deps goldens coverage fuzz bench
+.PHONY: all configure build man demo test asan-test ci clean deps goldens coverage fuzz bench
 
 all: build
 
@@ -83,6 +83,10 @@ bench:
 	$(CMAKE) --build $(BENCH_BUILD_DIR) -j $(JOBS)
 	$(BENCH_BUILD_DIR)/bench/robotconfig_bench $(BENCH_ARGS)
 	bench/corpus_bench.sh $(BENCH_BUILD_DIR)/robotcfg
+
+# Rewrites the manual page from the tool's help texts (a test compares them).
+man: build
+	$(ROBOTCFG) --man > docs/robotcfg.1
 
 ci:
 	./.ci/run

@@ -25,7 +25,7 @@ bool readAndCheckProgram(const std::string &sPath, const TOptions &options, TRea
   }
   program.pText = std::make_unique<CProgramText>(std::move(sBytes));
   program.pConfig = std::make_unique<CHostRobotConfiguration>();
-  program.pConfig->setPathName(CString::fromUtf8(sPath));
+  program.pConfig->setPathName(CString::fromUtf8(programPath(sPath)));
   TCheckOptions checkOptions;
   checkOptions.bBoardChosen = options.nBoard >= 0;
   TCheckResult result = checkProgram(*program.pConfig, *program.pText, checkOptions);

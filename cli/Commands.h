@@ -15,6 +15,8 @@ int runShow(const TOptions &options);
 int runDiff(const TOptions &options);
 int runModels(const TOptions &options);
 int runSaveModel(const TOptions &options);
+int runInit(const TOptions &options);
+int runCompletion(const TOptions &options);
 
 class CRobotConfigurationBasic;
 /// Prints the configuration as port tables.

@@ -3,26 +3,12 @@
 #include <cstdlib>
 #include <cstring>
 
+#include "cli/OptionTable.h"
 #include "robotconfig/host/CString.h"
 #include "robotconfig/host/DeviceCatalog.h"
 #include "robotconfig/host/Platform.h"
 
 namespace {
-
-struct TCommandName {
-  const char *pzName;
-  TCommand nCommand;
-};
-
-constexpr TCommandName kCommands[] = {
-    {"check", TCommand::kCheck},
-    {"format", TCommand::kFormat},
-    {"generate", TCommand::kGenerate},
-    {"show", TCommand::kShow},
-    {"diff", TCommand::kDiff},
-    {"models", TCommand::kModels},
-    {"save-model", TCommand::kSaveModel},
-};
 
 // A non-negative decimal number, or -1.
 int parseNumber(const std::string &sText) {
@@ -36,43 +22,33 @@ bool bSameWord(const std::string &sText, const wchar_t *pzWord) {
   return pzWord && CString::fromUtf8(sText).CompareNoCase(pzWord) == 0;
 }
 
-}  // namespace
-
-const char *usageText() {
-  return "usage: robotcfg [options] <command> [FILE...]\n"
-         "\n"
-         "Reads, checks and rewrites the '#pragma config(...)' block of robot programs.\n"
-         "\n"
-         "commands:\n"
-         "  check FILE...      report mistakes as FILE:LINE:COL: error: MESSAGE [CODE] (see docs/DIAGNOSTICS.md)\n"
-         "  format FILE...     print each program with its configuration block regenerated\n"
-         "  generate FILE      print only the regenerated configuration block\n"
-         "  show [FILE]        print the configuration (of FILE, or the empty one) as port tables\n"
-         "  diff A B           compare the configurations of two programs (-v: which devices differ)\n"
-         "  models             list the standard robot models of the platform\n"
-         "  save-model FILE -o OUT\n"
-         "                     save the configuration of FILE as a model file\n"
-         "\n"
-         "options:\n"
-         "  --platform KIND          platform kind: a number 0..14 or a name such as nxt, vexpic,\n"
-         "                           vexi2c, arduino (default: nxt)\n"
-         "  --board BOARD            controller board chosen in the IDE: a number or a board keyword\n"
-         "                           (default: the platform's own board)\n"
-         "  --external-controllers   enable \"External Motor/Servo Controllers\"\n"
-         "  -i, --in-place           format: rewrite the files instead of printing them\n"
-         "  --check                  format: change nothing; exit 1 when a block is not in generated form\n"
-         "  -v, --verbose            diff: list the devices that differ\n"
-         "  --format text|json|sarif check: how findings are reported (json and sarif on stdout)\n"
-         "  --Werror                 check, format: treat warnings as errors\n"
-         "  -q, --quiet              check, format: report errors only\n"
-         "  --show-source            show the offending line under each finding (default on a terminal)\n"
-         "  -o, --output OUT         save-model: the model file to write\n"
-         "  -h, --help               show this help\n"
-         "  --version                show the version\n"
-         "\n"
-         "FILE '-' reads standard input.\n"
-         "exit status: 0 success, 1 rejected lines (or --check found changes), 2 usage or I/O error.\n";
+// The option spelled `sArg` ("-i" or "--in-place"); null when none.
+const TOptionSpec *findOptionSpec(const std::string &sArg) {
+  for (size_t n = 0; n < kNumbOfOptionSpecs; ++n) {
+    const TOptionSpec &option = kOptionSpecs[n];
+    if (sArg == option.pzLong || (option.pzShort && sArg == option.pzShort)) return &option;
+  }
+  return nullptr;
 }
+
+// "the format command" or "the check and format commands": where an option applies.
+std::string commandsOf(unsigned nCommands) {
+  std::vector<std::string> names;
+  for (size_t n = 0; n < kNumbOfCommandSpecs; ++n)
+    if (nCommands & commandBit(kCommandSpecs[n].nCommand)) names.push_back(kCommandSpecs[n].pzName);
+  std::string sText = "the ";
+  for (size_t n = 0; n < names.size(); ++n)
+    sText += (n == 0 ? "" : n + 1 == names.size() ? " and " : ", ") + names[n];
+  return sText + (names.size() == 1 ? " command" : " commands");
+}
+
+std::string joined(const std::vector<std::string> &words) {
+  std::string sText;
+  for (const std::string &sWord : words) sText += (sText.empty() ? "" : ", ") + sWord;
+  return sText;
+}
+
+}  // namespace
 
 int findPlatformKind(const std::string &sText) {
   const int nNumber = parseNumber(sText);
@@ -94,12 +70,41 @@ TControllerBoardType findBoard(const std::string &sText) {
   return -1;
 }
 
+std::vector<std::string> platformNames() {
+  std::vector<std::string> names;
+  for (int nKind = 0; nKind < kNumbOfPlatformKinds; ++nKind) {
+    const CPlatformType *pPlatform = getPlatformTypeForKind(nKind);
+    if (pPlatform && pPlatform->pKeyword && *pPlatform->pKeyword) names.push_back(CString(pPlatform->pKeyword).toUtf8());
+  }
+  return names;
+}
+
+std::vector<std::string> boardKeywords() {
+  std::vector<std::string> words;
+  for (const TDeviceTypeMenuItem *pRow = getArduinoCircuitBoardTypeMenuDefn(); pRow && pRow->nPlatformMask != 0; ++pRow)
+    if (pRow->pzKeyword && *pRow->pzKeyword) words.push_back(CString(pRow->pzKeyword).toUtf8());
+  return words;
+}
+
+std::string unknownPlatformMessage(const std::string &sText) {
+  return "unknown platform '" + sText + "' (a number 0.." + std::to_string(kNumbOfPlatformKinds - 1) +
+         " or one of: " + joined(platformNames()) + ")";
+}
+
+std::string unknownBoardMessage(const std::string &sText) {
+  return "unknown board '" + sText + "' (a board number or one of: " + joined(boardKeywords()) + ")";
+}
+
 bool parseOptions(int argc, char **argv, TOptions &options, std::string &sError) {
   bool bOptionsEnded = false;
-  std::string sPlatform, sBoard;
-  bool bPlatformGiven = false, bBoardGiven = false;
+  unsigned nUsed = 0;        // bits of the options given, by their place in the table
+  std::string sFirstUsed[64];  // how each was spelled, for messages
   for (int i = 1; i < argc; ++i) {
     std::string sArg = argv[i];
+    if (!bOptionsEnded && sArg == "--") {
+      bOptionsEnded = true;
+      continue;
+    }
     if (!bOptionsEnded && sArg.size() > 1 && sArg[0] == '-') {
       std::string sValue;
       bool bHasValue = false;
@@ -109,143 +114,86 @@ bool parseOptions(int argc, char **argv, TOptions &options, std::string &sError)
         sArg = sArg.substr(0, nEquals);
         bHasValue = true;
       }
-      auto takeValue = [&](std::string &sOut) {
-        if (bHasValue) {
-          sOut = sValue;
-          return true;
-        }
+      const TOptionSpec *pOption = findOptionSpec(sArg);
+      if (!pOption) {
+        sError = "unknown option '" + sArg + "'";
+        return false;
+      }
+      if (pOption->pzValue && !bHasValue) {
         if (i + 1 >= argc) {
           sError = "option '" + sArg + "' needs a value";
           return false;
         }
-        sOut = argv[++i];
-        return true;
-      };
-      if (sArg == "--") bOptionsEnded = true;
-      else if (sArg == "-h" || sArg == "--help") options.bHelp = true;
-      else if (sArg == "--version") options.bVersion = true;
-      else if (sArg == "-i" || sArg == "--in-place") options.bInPlace = true;
-      else if (sArg == "--check") options.bCheckOnly = true;
-      else if (sArg == "-v" || sArg == "--verbose") options.bVerbose = true;
-      else if (sArg == "-o" || sArg == "--output") {
-        if (!takeValue(options.sOutputPath)) return false;
-      }
-      else if (sArg == "--Werror") options.bWarningsAreErrors = true;
-      else if (sArg == "-q" || sArg == "--quiet") options.bQuiet = true;
-      else if (sArg == "--show-source") options.bShowSource = true;
-      else if (sArg == "--format") {
-        if (!takeValue(options.sReportFormat)) return false;
-        if (options.sReportFormat != "text" && options.sReportFormat != "json" && options.sReportFormat != "sarif") {
-          sError = "unknown report format '" + options.sReportFormat + "' (text, json or sarif)";
-          return false;
-        }
-      }
-      else if (sArg == "--external-controllers") options.bExternalControllers = true;
-      else if (sArg == "--platform") {
-        if (!takeValue(sPlatform)) return false;
-        bPlatformGiven = true;
-      } else if (sArg == "--board") {
-        if (!takeValue(sBoard)) return false;
-        bBoardGiven = true;
-      } else {
-        sError = "unknown option '" + sArg + "'";
-        return false;
-      }
-      if (bHasValue && sArg != "--platform" && sArg != "--board" && sArg != "--output" &&
-          sArg != "--format") {
+        sValue = argv[++i];
+      } else if (!pOption->pzValue && bHasValue) {
         sError = "option '" + sArg + "' takes no value";
         return false;
+      }
+      if (!pOption->apply(options, sValue, sError)) return false;
+      const size_t nIndex = size_t(pOption - kOptionSpecs);
+      if (nIndex < 32 && !(nUsed & (1u << nIndex))) {
+        nUsed |= 1u << nIndex;
+        sFirstUsed[nIndex] = sArg;
       }
       continue;
     }
     if (options.nCommand == TCommand::kNone) {
-      for (const TCommandName &command : kCommands)
-        if (sArg == command.pzName) options.nCommand = command.nCommand;
-      if (options.nCommand == TCommand::kNone) {
+      const TCommandSpec *pCommand = findCommandSpec(sArg);
+      if (!pCommand) {
         sError = "unknown command '" + sArg + "'";
         return false;
       }
+      options.nCommand = pCommand->nCommand;
       continue;
     }
     options.files.push_back(sArg);
   }
-  if (options.bHelp || options.bVersion) return true;
+  if (options.bHelp || options.bVersion || options.bManPage) return true;
 
-  if (!bPlatformGiven) {
+  if (!options.bPlatformGiven) {
     const char *pzEnv = std::getenv("ROBOTCFG_PLATFORM");
-    if (pzEnv && *pzEnv) sPlatform = pzEnv;
-  }
-  if (bPlatformGiven || !sPlatform.empty()) {
-    options.nPlatformKind = findPlatformKind(sPlatform);
-    if (options.nPlatformKind < 0) {
-      sError = "unknown platform '" + sPlatform + "'";
-      return false;
-    }
-  }
-  if (bBoardGiven) {
-    options.nBoard = findBoard(sBoard);
-    if (options.nBoard < 0) {
-      sError = "unknown board '" + sBoard + "'";
-      return false;
+    if (pzEnv && *pzEnv) {
+      options.nPlatformKind = findPlatformKind(pzEnv);
+      if (options.nPlatformKind < 0) {
+        sError = unknownPlatformMessage(pzEnv) + " in ROBOTCFG_PLATFORM";
+        return false;
+      }
+      options.bPlatformFromEnvironment = true;
     }
   }
 
-  switch (options.nCommand) {
-    case TCommand::kNone:
-      sError = "no command given";
+  const TCommandSpec *pCommand = commandSpecOf(options.nCommand);
+  if (!pCommand) {
+    sError = "no command given";
+    return false;
+  }
+  const int nFiles = int(options.files.size());
+  if (nFiles < pCommand->nMinFiles || (pCommand->nMaxFiles >= 0 && nFiles > pCommand->nMaxFiles) ||
+      (options.nCommand == TCommand::kSaveModel && options.sOutputPath.empty())) {
+    sError = pCommand->pzFileError;
+    return false;
+  }
+  for (size_t n = 0; n < kNumbOfOptionSpecs && n < 32; ++n)
+    if ((nUsed & (1u << n)) && !(kOptionSpecs[n].nCommands & commandBit(options.nCommand))) {
+      sError = sFirstUsed[n] + " applies to " + commandsOf(kOptionSpecs[n].nCommands) + " only";
       return false;
-    case TCommand::kCheck:
-    case TCommand::kFormat:
-      if (options.files.empty()) {
-        sError = "no input files";
-        return false;
-      }
-      break;
-    case TCommand::kGenerate:
-      if (options.files.size() != 1) {
-        sError = "generate takes exactly one file";
-        return false;
-      }
-      break;
-    case TCommand::kShow:
-      if (options.files.size() > 1) {
-        sError = "show takes at most one file";
-        return false;
-      }
-      break;
-    case TCommand::kDiff:
-      if (options.files.size() != 2) {
-        sError = "diff takes exactly two files";
-        return false;
-      }
-      break;
-    case TCommand::kModels:
-      if (!options.files.empty()) {
-        sError = "models takes no file";
-        return false;
-      }
-      break;
-    case TCommand::kSaveModel:
-      if (options.files.size() != 1 || options.sOutputPath.empty()) {
-        sError = "save-model takes one file and -o OUT";
-        return false;
-      }
-      break;
-  }
-  if (options.bVerbose && options.nCommand != TCommand::kDiff) {
-    sError = "-v applies to the diff command only";
+    }
+  if (options.nCommand == TCommand::kCompletion && options.files[0] != "bash" && options.files[0] != "zsh" &&
+      options.files[0] != "fish") {
+    sError = "unknown shell '" + options.files[0] + "' (bash, zsh or fish)";
     return false;
   }
-  if ((options.bInPlace || options.bCheckOnly) && options.nCommand != TCommand::kFormat) {
-    sError = "-i and --check apply to the format command only";
+  // What format does with a file: one way only.
+  std::vector<std::string> ways;
+  if (options.bInPlace) ways.push_back("-i");
+  if (options.bCheckOnly) ways.push_back("--check");
+  if (options.bDiff) ways.push_back("--diff");
+  if (ways.size() > 1) {
+    sError = ways[0] + " and " + ways[1] + " cannot be combined";
     return false;
   }
-  if (options.sReportFormat != "text" && options.nCommand != TCommand::kCheck) {
-    sError = "--format applies to the check command only";
-    return false;
-  }
-  if (options.bInPlace && options.bCheckOnly) {
-    sError = "-i and --check cannot be combined";
+  if (options.bNoConfig && !options.sConfigPath.empty()) {
+    sError = "--config and --no-config cannot be combined";
     return false;
   }
   if (options.bInPlace)

@@ -19,7 +19,21 @@ int CWarningPrinter::showMessage(const THostMessage &message) {
   return 0;
 }
 
-std::string displayName(const std::string &sPath) { return sPath == "-" ? "<stdin>" : sPath; }
+namespace {
+std::string &stdinFilename() {
+  static std::string sName;
+  return sName;
+}
+}  // namespace
+
+void setStdinFilename(const std::string &sName) { stdinFilename() = sName; }
+
+std::string displayName(const std::string &sPath) {
+  if (sPath != "-") return sPath;
+  return stdinFilename().empty() ? "<stdin>" : stdinFilename();
+}
+
+std::string programPath(const std::string &sPath) { return sPath == "-" ? stdinFilename() : sPath; }
 
 bool readProgram(const std::string &sPath, TReadProgram &program) {
   std::string sBytes, sError;
@@ -29,7 +43,7 @@ bool readProgram(const std::string &sPath, TReadProgram &program) {
   }
   program.pText = std::make_unique<CProgramText>(std::move(sBytes));
   program.pConfig = std::make_unique<CHostRobotConfiguration>();
-  program.pConfig->setPathName(CString::fromUtf8(sPath));
+  program.pConfig->setPathName(CString::fromUtf8(programPath(sPath)));
   CWarningPrinter warnings(displayName(sPath));
   program.diagnostics = readProgramConfiguration(*program.pConfig, *program.pText);
   return true;

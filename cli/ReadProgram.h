@@ -26,8 +26,13 @@ class CWarningPrinter : public CHostMessageSink {
   CHostMessageSink *m_pPrevious;
 };
 
-/// The name a path is reported under ("<stdin>" for "-").
+/// The name a path is reported under ("<stdin>" for "-", unless named).
 std::string displayName(const std::string &sPath);
+/// Names the program read from "-" (--stdin-filename); "" for none.
+void setStdinFilename(const std::string &sName);
+/// Where a program counts as being, for the files it names and its project
+/// file: its path, or the --stdin-filename name for "-" ("" when none).
+std::string programPath(const std::string &sPath);
 
 /// One program read into a configuration.
 struct TReadProgram {

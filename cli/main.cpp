@@ -6,6 +6,8 @@
 #include <string>
 
 #include "cli/Commands.h"
+#include "cli/Help.h"
+#include "cli/ReadProgram.h"
 #include "cli/Options.h"
 #include "robotconfig/host/Platform.h"
 #include "robotconfig/program/StandardModelList.h"
@@ -24,13 +26,18 @@ int main(int argc, char **argv) {
     return kExitUsage;
   }
   if (options.bHelp) {
-    std::fputs(usageText(), stdout);
+    std::fputs(usageText(options.nCommand).c_str(), stdout);
+    return kExitOk;
+  }
+  if (options.bManPage) {
+    std::fputs(manPage().c_str(), stdout);
     return kExitOk;
   }
   if (options.bVersion) {
     std::printf("robotcfg %s\n", ROBOTCONFIG_VERSION);
     return kExitOk;
   }
+  setStdinFilename(options.sStdinFilename);
   selectHostPlatform(options.nPlatformKind, options.nBoard, options.bExternalControllers);
   installHostStandardModelList();
   int nStatus = kExitUsage;
@@ -42,6 +49,8 @@ int main(int argc, char **argv) {
     case TCommand::kDiff: nStatus = runDiff(options); break;
     case TCommand::kModels: nStatus = runModels(options); break;
     case TCommand::kSaveModel: nStatus = runSaveModel(options); break;
+    case TCommand::kInit: nStatus = runInit(options); break;
+    case TCommand::kCompletion: nStatus = runCompletion(options); break;
     case TCommand::kNone: break;
   }
   // Output that could not be written (a full disk, a closed pipe) is an I/O error.

@@ -107,22 +107,38 @@ TEST(Cli, UsageErrorsExitWithStatusTwoAndAHint) {
   const std::string sFile = dir.file("p.c");
   const std::string sProgram = "#pragma config(UserModel, m)\nint x;\n";
   writeFile(sFile, sProgram);
+  // A bad platform or board lists what is accepted.
+  const std::string kPlatforms =
+      " (a number 0..14 or one of: none, nxt, vexpic, vexi2c, arduino, sensorlab, datalogger, sharedports, brick4, "
+      "classroom, maker10, maker11, maker12, maker13, maker14)";
+  const std::string kBoards =
+      " (a board number or one of: typeCktBoardDuemilanove, typeCktBoardDiecimila, typeCktBoardUno, typeCktBoardUnoSMD, "
+      "typeCktBoardMega, typeCktBoardMega2560, typeCktBoardNano, typeCktBoardProMini5V, typeCktBoardProMini3V3, "
+      "typeCktBoardUnoMotorController, typeCktBoardUnoMotorControllerRev2, typeCktBoardLeonardo, typeCktBoardMicro, "
+      "typeCktBoardEthernet, typeCktBoardFio, typeCktBoardLilyPad, typeCktBoardMegaExpansion, typeCktBoardUnoRobotKit, "
+      "typeCktBoardUnoServoKit, typeCktBoardGeneric, typeCktBoardMakerClassic, typeCktBoardMakerMega, "
+      "typeCktBoardMakerMini, typeCktBoardMakerPro, typeCktBoardMakerEdu, typeCktBoardMakerEduPlus, "
+      "typeCktBoardMakerWireless, typeCktBoardMakerSensorHub, typeCktBoardMakerRover, typeCktBoardMakerArm, "
+      "typeCktBoardMakerLite)";
   const struct {
     std::vector<std::string> args;
     std::string sMessage;
   } kCases[] = {
       {{"--bogus", "check", sFile}, "unknown option '--bogus'"},
       {{"check", "-x", sFile}, "unknown option '-x'"},
-      {{"--platform", "mars", "check", sFile}, "unknown platform 'mars'"},
-      {{"--platform=15", "check", sFile}, "unknown platform '15'"},
-      {{"--platform=", "check", sFile}, "unknown platform ''"},
-      {{"--board", "typeCktBoardNoSuch", "check", sFile}, "unknown board 'typeCktBoardNoSuch'"},
-      {{"--board=", "check", sFile}, "unknown board ''"},
+      {{"--platform", "mars", "check", sFile}, "unknown platform 'mars'" + kPlatforms},
+      {{"--platform=15", "check", sFile}, "unknown platform '15'" + kPlatforms},
+      {{"--platform=", "check", sFile}, "unknown platform ''" + kPlatforms},
+      {{"--board", "typeCktBoardNoSuch", "check", sFile}, "unknown board 'typeCktBoardNoSuch'" + kBoards},
+      {{"--board=", "check", sFile}, "unknown board ''" + kBoards},
       {{"check", sFile, "--platform"}, "option '--platform' needs a value"},
       {{"--check=1", "format", sFile}, "option '--check' takes no value"},
       {{"format", "-i", "-"}, "cannot rewrite standard input in place"},
       {{"format", "-i", "--check", sFile}, "-i and --check cannot be combined"},
-      {{"check", "-i", sFile}, "-i and --check apply to the format command only"},
+      {{"check", "-i", sFile}, "-i applies to the format command only"},
+      {{"show", "--in-place", sFile}, "--in-place applies to the format command only"},
+      {{"models", "-q"}, "-q applies to the check and format commands only"},
+      {{"completion", "tcsh"}, "unknown shell 'tcsh' (bash, zsh or fish)"},
       {{"lint", sFile}, "unknown command 'lint'"},
       {{}, "no command given"},
       {{"check"}, "no input files"},

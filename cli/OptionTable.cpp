@@ -1,0 +1,145 @@
+#include "cli/OptionTable.h"
+
+#include <cstring>
+
+namespace {
+
+constexpr unsigned kCheck = commandBit(TCommand::kCheck);
+constexpr unsigned kFormat = commandBit(TCommand::kFormat);
+constexpr unsigned kGenerate = commandBit(TCommand::kGenerate);
+constexpr unsigned kShow = commandBit(TCommand::kShow);
+constexpr unsigned kDiff = commandBit(TCommand::kDiff);
+constexpr unsigned kSaveModel = commandBit(TCommand::kSaveModel);
+/// Commands that read programs, and so a project file.
+constexpr unsigned kReading = kCheck | kFormat | kGenerate | kShow | kDiff | kSaveModel;
+
+using TApply = bool (*)(TOptions &, const std::string &, std::string &);
+
+bool setReportFormat(TOptions &options, const std::string &sValue, std::string &sError) {
+  if (sValue != "text" && sValue != "json" && sValue != "sarif") {
+    sError = "unknown report format '" + sValue + "' (text, json or sarif)";
+    return false;
+  }
+  options.sReportFormat = sValue;
+  return true;
+}
+
+bool setPlatform(TOptions &options, const std::string &sValue, std::string &sError) {
+  options.nPlatformKind = findPlatformKind(sValue);
+  if (options.nPlatformKind < 0) sError = unknownPlatformMessage(sValue);
+  options.bPlatformGiven = true;
+  return options.nPlatformKind >= 0;
+}
+
+bool setBoard(TOptions &options, const std::string &sValue, std::string &sError) {
+  options.nBoard = findBoard(sValue);
+  if (options.nBoard < 0) sError = unknownBoardMessage(sValue);
+  options.bBoardGiven = true;
+  return options.nBoard >= 0;
+}
+
+#define SWITCH(field) [](TOptions &o, const std::string &, std::string &) { return o.field = true; }
+#define TEXT(field) [](TOptions &o, const std::string &s, std::string &) { return o.field = s, true; }
+
+}  // namespace
+
+const TCommandSpec kCommandSpecs[] = {
+    {TCommand::kCheck, "check", "FILE...", 1, -1, "no input files",
+     "report mistakes as FILE:LINE:COL: error: MESSAGE [CODE]",
+     "Reads the configuration block of each program and reports every line that is\n"
+     "refused or would be lost, with warnings for legal but doubtful settings\n"
+     "(docs/DIAGNOSTICS.md lists the codes). FILE '-' reads standard input.\n",
+     "0 no errors, 1 errors found (or warnings with --Werror), 2 usage or I/O error.",
+     "robotcfg check --platform vexpic robot.c\nrobotcfg check .    # with a robotcfg.toml"},
+    {TCommand::kFormat, "format", "FILE...", 1, -1, "no input files",
+     "print each program with its configuration block regenerated",
+     "Regenerates the configuration block of each program in its settled form and\n"
+     "prints the program, or rewrites it with -i. Nothing else in the file changes.\n"
+     "A program with a refused line is left alone.\n",
+     "0 done (with --check: nothing would change), 1 refused lines or a block "
+     "that would change, 2 usage or I/O error.",
+     "robotcfg format -i robot.c"},
+    {TCommand::kGenerate, "generate", "FILE", 1, 1, "generate takes exactly one file",
+     "print only the regenerated configuration block",
+     "Prints the configuration block that format would write, without the rest of\n"
+     "the program.\n",
+     "0 done, 1 refused lines, 2 usage or I/O error.", "robotcfg generate robot.c"},
+    {TCommand::kShow, "show", "[FILE]", 0, 1, "show takes at most one file",
+     "print the configuration (of FILE, or the empty one) as port tables",
+     "Prints the motors, sensors, servos, board, drive train and memory of a\n"
+     "program's configuration, or of the empty configuration of the platform.\n",
+     "0 done, 1 refused lines, 2 usage or I/O error.", "robotcfg show --platform nxt --external-controllers"},
+    {TCommand::kDiff, "diff", "A B", 2, 2, "diff takes exactly two files",
+     "compare the configurations of two programs (-v: which devices differ)",
+     "Says whether two programs' configurations are the same, differ only in device\n"
+     "names, only in model names, or in settings.\n",
+     "0 same, 1 different, 2 usage or I/O error, or refused lines in either file.",
+     "robotcfg diff -v old.c new.c"},
+    {TCommand::kModels, "models", "", 0, 0, "models takes no file",
+     "list the standard robot models of the platform",
+     "Lists the standard robot models of the selected platform, which a\n"
+     "StandardModel line can name.\n",
+     "0 done, 2 usage error.", "robotcfg models --platform nxt"},
+    {TCommand::kSaveModel, "save-model", "FILE -o OUT", 1, 1, "save-model takes one file and -o OUT",
+     "save the configuration of FILE as a model file",
+     "Writes the configuration of FILE, device by device, as a model file that a\n"
+     "UserModel line can name.\n",
+     "0 saved, 1 refused lines, 2 usage or I/O error.", "robotcfg save-model robot.c -o base.model"},
+        {TCommand::kCompletion, "completion", "bash|zsh|fish", 1, 1, "completion takes one shell: bash, zsh or fish",
+     "print a shell completion script",
+     "Prints a completion script for the shell: commands, options, platform names\n"
+     "and board keywords.\n",
+     "0 done, 2 unknown shell.",
+     "robotcfg completion bash > ~/.local/share/bash-completion/completions/robotcfg"},
+};
+const size_t kNumbOfCommandSpecs = sizeof(kCommandSpecs) / sizeof(kCommandSpecs[0]);
+
+const TOptionSpec kOptionSpecs[] = {
+    {nullptr, "--platform", "KIND", kEveryCommand,
+     "platform kind: a number 0..14 or a name such as nxt, vexpic, vexi2c, arduino "
+     "(default: $ROBOTCFG_PLATFORM, else nxt)",
+     "@platforms", setPlatform},
+    {nullptr, "--board", "BOARD", kEveryCommand,
+     "controller board chosen in the IDE: a number or a board keyword (default: the platform's own board)",
+     "@boards", setBoard},
+    {nullptr, "--external-controllers", nullptr, kEveryCommand, "enable \"External Motor/Servo Controllers\"", nullptr,
+     [](TOptions &o, const std::string &, std::string &) { return o.bExternalControllers = o.bExternalGiven = true; }},
+            {nullptr, "--stdin-filename", "NAME", kReading,
+     "the name of the program read from '-' in messages (and the folder its user models are found in)", "@files",
+     TEXT(sStdinFilename)},
+    {"-i", "--in-place", nullptr, kFormat, "rewrite the files instead of printing them", nullptr, SWITCH(bInPlace)},
+    {nullptr, "--check", nullptr, kFormat, "change nothing; exit 1 when a block is not in generated form", nullptr,
+     SWITCH(bCheckOnly)},
+            {"-v", "--verbose", nullptr, kDiff, "list the devices that differ",
+     nullptr, SWITCH(bVerbose)},
+    {nullptr, "--format", "text|json|sarif", kCheck, "how findings are reported (json and sarif on standard output)",
+     "text json sarif", setReportFormat},
+    {nullptr, "--Werror", nullptr, kCheck | kFormat, "treat warnings as errors", nullptr, SWITCH(bWarningsAreErrors)},
+    {"-q", "--quiet", nullptr, kCheck | kFormat, "report errors only", nullptr, SWITCH(bQuiet)},
+    {nullptr, "--show-source", nullptr, kCheck | kFormat,
+     "show the offending line under each finding (default on a terminal)", nullptr, SWITCH(bShowSource)},
+    {"-o", "--output", "OUT", kSaveModel, "the model file to write", "@files", TEXT(sOutputPath)},
+        {"-h", "--help", nullptr, kEveryCommand, "show this help (after a command: the command's)", nullptr, SWITCH(bHelp)},
+    {nullptr, "--version", nullptr, kEveryCommand, "show the version", nullptr, SWITCH(bVersion)},
+    {nullptr, "--man", nullptr, kEveryCommand, "print the manual page (roff)", nullptr, SWITCH(bManPage)},
+};
+const size_t kNumbOfOptionSpecs = sizeof(kOptionSpecs) / sizeof(kOptionSpecs[0]);
+
+const TCommandSpec *findCommandSpec(const std::string &sName) {
+  for (const TCommandSpec &command : kCommandSpecs)
+    if (sName == command.pzName) return &command;
+  return nullptr;
+}
+
+const TCommandSpec *commandSpecOf(TCommand nCommand) {
+  for (const TCommandSpec &command : kCommandSpecs)
+    if (command.nCommand == nCommand) return &command;
+  return nullptr;
+}
+
+std::string optionLabel(const TOptionSpec &option) {
+  std::string sLabel = option.pzShort ? std::string(option.pzShort) + ", " : std::string();
+  sLabel += option.pzLong;
+  if (option.pzValue) sLabel += std::string(" ") + option.pzValue;
+  return sLabel;
+}
