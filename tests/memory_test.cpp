@@ -13,194 +13,127 @@
 #include "tests/config_lines.h"
 
 namespace {
+using test_support::generatedLines;
 using test_support::parseLine;
-
 
 class MemorySettings : public ::testing::Test {
  protected:
   CHostSelectionScope scope;
 };
 
-std::vector<std::wstring> memoryLines(CRobotConfigurationBasic &rec) {
-  CString sText;
-  rec.buildSourceCodeForConfiguration(sText, false);
-  std::vector<std::wstring> lines;
-  const std::wstring &s = sText.str();
-  const std::wstring sPrefix = L"#pragma config(MemorySize";
-  for (size_t pos = 0; pos < s.size();) {
-    size_t end = s.find(L"\r\n", pos);
-    if (end == std::wstring::npos) end = s.size();
-    if (s.compare(pos, sPrefix.size(), sPrefix) == 0) lines.push_back(s.substr(pos, end - pos));
-    pos = end + 2;
-  }
-  return lines;
-}
-
 using TSizes = std::array<int32_t, 3>;
 
-TEST_F(MemorySettings, ReadingAndWritingSizes) {
+TEST_F(MemorySettings, MemorySizeLine) {
   selectHostPlatform(platformVexI2c);
   CHostRobotConfiguration rec;
-  EXPECT_TRUE(memoryLines(rec).empty());
-
-  CString sError(L"stale");
-  EXPECT_TRUE(parseLine(rec, L"#pragma config(MemorySize, auto, 300, 1000)", sError));
-  EXPECT_EQ(rec.getSettings().nMemorySizes, (TSizes{-1, -1, 1000}));
-  EXPECT_EQ(sError, L"");
-  EXPECT_EQ(memoryLines(rec), (std::vector<std::wstring>{L"#pragma config(MemorySize, auto, auto, 1000)"}));
-
-  EXPECT_TRUE(parseLine(rec, L"#pragma config(MemorySize, 500, 600, auto)", sError));
-  EXPECT_EQ(rec.getSettings().nMemorySizes, (TSizes{500, 600, -1}));
-  EXPECT_EQ(memoryLines(rec), (std::vector<std::wstring>{L"#pragma config(MemorySize, 500, 600, auto)"}));
-
-  EXPECT_TRUE(parseLine(rec, L"#pragma config(MemorySize, 0, 65535, 4096)", sError));
-  EXPECT_EQ(rec.getSettings().nMemorySizes, (TSizes{0, 65535, 4096}));
-  EXPECT_EQ(memoryLines(rec), (std::vector<std::wstring>{L"#pragma config(MemorySize, 0, 65535, 4096)"}));
-
-  // -1 written as a number means auto, and "auto" is compared with case.
-  EXPECT_TRUE(parseLine(rec, L"#pragma config(MemorySize, -1, 7, -1)", sError));
-  EXPECT_EQ(rec.getSettings().nMemorySizes, (TSizes{-1, 7, -1}));
-  EXPECT_TRUE(memoryLines(rec).empty());
-  EXPECT_FALSE(parseLine(rec, L"#pragma config(MemorySize, Auto, 7, 8)", sError));
-  EXPECT_EQ(sError, L"'Auto' is not a numeric value");
-}
-
-TEST_F(MemorySettings, RefusedSizes) {
-  selectHostPlatform(platformVexI2c);
-  CHostRobotConfiguration rec;
-  CString sError;
-  EXPECT_FALSE(parseLine(rec, L"#pragma config(MemorySize, 65536, 10, 10)", sError));
-  EXPECT_EQ(sError, L"'65536' is not in the range -1..65535");
-  EXPECT_EQ(rec.getSettings().nMemorySizes, (TSizes{-1, -1, -1}));
-
-  // The first size stays when the second is refused.
-  EXPECT_FALSE(parseLine(rec, L"#pragma config(MemorySize, 100, -2, 10)", sError));
-  EXPECT_EQ(sError, L"'-2' is not in the range -1..65535");
-  EXPECT_EQ(rec.getSettings().nMemorySizes, (TSizes{100, -1, -1}));
-
-  EXPECT_FALSE(parseLine(rec, L"#pragma config(MemorySize, 100, 200, 5000)", sError));
-  EXPECT_EQ(sError, L"'5000' is not in the range -1..4096");
-  EXPECT_EQ(rec.getSettings().nMemorySizes, (TSizes{100, 200, -1}));
-
-  EXPECT_FALSE(parseLine(rec, L"#pragma config(MemorySize, auto, auto, x12)", sError));
-  EXPECT_EQ(sError, L"'x12' is not a numeric value");
-  EXPECT_FALSE(parseLine(rec, L"#pragma config(MemorySize, 0x10, 5, auto)", sError));
-  EXPECT_EQ(sError, L"'0x10' is not a numeric value");
-  EXPECT_FALSE(parseLine(rec, L"#pragma config(MemorySize, auto, auto)", sError));
-  EXPECT_EQ(sError, L"'' is not a numeric value");
-  EXPECT_FALSE(parseLine(rec, L"#pragma config(MemorySize, 1, 2, 99999999999)", sError));
-  EXPECT_EQ(sError, L"'99999999999' is not a numeric value");
-}
-
-TEST_F(MemorySettings, OnlyAMemoryLineMakesAWholeBlock) {
+  struct TCase {
+    const wchar_t *pzParms;
+    TSizes sizes;  // after the line
+    const wchar_t *pzWritten;  // nullptr: no line; L"!..": refused with that message
+  } kCases[] = {
+      {L"auto, 300, 1000", {-1, -1, 1000}, L"auto, auto, 1000"},  // a size beside auto is dropped
+      {L"0, 65535, 4096", {0, 65535, 4096}, L"0, 65535, 4096"},
+      {L"-1, 7, -1", {-1, 7, -1}, nullptr},
+      {L"Auto, 7, 8", {-1, 7, -1}, L"!'Auto' is not a numeric value"},
+      {L"65536, 10, 10", {-1, 7, -1}, L"!'65536' is not in the range -1..65535"},
+      {L"100, -2, 10", {100, 7, -1}, L"!'-2' is not in the range -1..65535"},  // the first size stays
+      {L"100, 200, 5000", {100, 200, -1}, L"!'5000' is not in the range -1..4096"},
+      {L"0x10, 5, auto", {100, 200, -1}, L"!'0x10' is not a numeric value"},
+      {L"auto, auto", {-1, -1, -1}, L"!'' is not a numeric value"},
+      {L"1, 2, 99999999999", {1, 2, -1}, L"!'99999999999' is not a numeric value"},
+  };
+  for (const TCase &c : kCases) {
+    SCOPED_TRACE(CString(c.pzParms).toUtf8());
+    CString sError;
+    const bool bRefused = c.pzWritten && c.pzWritten[0] == L'!';
+    EXPECT_EQ(parseLine(rec, std::wstring(L"#pragma config(MemorySize, ") + c.pzParms + L")", sError), !bRefused);
+    EXPECT_EQ(rec.getSettings().nMemorySizes, c.sizes);
+    if (bRefused) {
+      EXPECT_EQ(sError.str(), c.pzWritten + 1);
+    } else {
+      EXPECT_EQ(generatedLines(rec, L"#pragma config(MemorySize"),
+                c.pzWritten ? std::vector<std::wstring>{std::wstring(L"#pragma config(MemorySize, ") + c.pzWritten + L")"}
+                            : std::vector<std::wstring>{});
+    }
+  }
+  // Only a memory line makes a whole block.
   selectHostPlatform(platformNone);
-  CHostRobotConfiguration rec;
+  CHostRobotConfiguration none;
   CString sText(L"stale");
-  EXPECT_FALSE(rec.buildSourceCodeForConfiguration(sText, false));
+  EXPECT_FALSE(none.buildSourceCodeForConfiguration(sText, false));
   EXPECT_EQ(sText, L"");
-  rec.settings.nMemorySizes = {-1, 300, 128};
-  EXPECT_TRUE(rec.buildSourceCodeForConfiguration(sText, false));
+  none.settings.nMemorySizes = {-1, 300, 128};
+  EXPECT_TRUE(none.buildSourceCodeForConfiguration(sText, false));
   EXPECT_EQ(sText, L"#pragma config(MemorySize, auto, auto, 128)\r\n"
                    L"//*!!Code automatically generated by 'TAVREN' configuration wizard               !!*//\r\n"
                    L"\r\n");
 }
 
-TEST_F(MemorySettings, PlatformLimits) {
-  selectHostPlatform(platformNxt);
-  TRamMemoryLimits limits;
-  limits.nOtherRamSize = 77;
-  limits.loadDefaultMemorySettings();
-  EXPECT_EQ(limits.nNumbOfTasks, 10);
-  EXPECT_EQ(limits.nDefaultDatalogStreamSize, 5000);
-  EXPECT_EQ(limits.nDefaultDebugStreamSize, 1000);
-  EXPECT_EQ(limits.nDefaultTaskStackSize, 400);
-  EXPECT_EQ(limits.nMaxSingleFunctionStack, 2048);
-  EXPECT_EQ(limits.nOtherRamSize, 77);  // the host's own
-}
-
-TEST_F(MemorySettings, StreamSplit) {
+TEST_F(MemorySettings, StreamSplitAndAutomaticSizing) {
   TMemoryAllocation allocation;
-  allocation.nDatalogStreamSize = 1000;
-  allocation.nDebugStreamSize = 1000;
-  allocation.setDebugStreamPercentage(0.3f);
-  EXPECT_EQ(allocation.nDebugStreamSize, 600);
-  EXPECT_EQ(allocation.nDatalogStreamSize, 1400);
+  struct TSplit {
+    int nDatalog, nDebug;
+    float fShare;
+    int nNewDatalog, nNewDebug;
+  } kSplits[] = {
+      {1000, 1000, 0.3f, 1400, 600}, {7, 3, 0.3f, 10, 0},  // cut down to a multiple of 4
+      {7, 3, 0.99f, 2, 8},           {7, 3, 2.5f, 2, 8},   // outside 0..1: the nearest end
+      {7, 3, std::nanf(""), 10, 0},
+  };
+  for (const TSplit &s : kSplits) {
+    allocation.nDatalogStreamSize = s.nDatalog;
+    allocation.nDebugStreamSize = s.nDebug;
+    allocation.setDebugStreamPercentage(s.fShare);
+    EXPECT_EQ(allocation.nDebugStreamSize, s.nNewDebug) << s.fShare;
+    EXPECT_EQ(allocation.nDatalogStreamSize, s.nNewDatalog) << s.fShare;
+  }
+  allocation.nDatalogStreamSize = 1400;
+  allocation.nDebugStreamSize = 600;
   EXPECT_FLOAT_EQ(allocation.getDebugStreamPercentage(), 0.3f);
-
-  allocation.nDatalogStreamSize = 7;
-  allocation.nDebugStreamSize = 3;
-  allocation.setDebugStreamPercentage(0.3f);  // 3, cut down to a multiple of 4
-  EXPECT_EQ(allocation.nDebugStreamSize, 0);
-  EXPECT_EQ(allocation.nDatalogStreamSize, 10);
-  allocation.setDebugStreamPercentage(0.99f);  // 9.9 -> 9 -> 8
-  EXPECT_EQ(allocation.nDebugStreamSize, 8);
-  EXPECT_EQ(allocation.nDatalogStreamSize, 2);
-
-  // Shares outside 0..1 are taken as the nearest end, never a negative stream.
-  allocation.setDebugStreamPercentage(2.5f);
-  EXPECT_EQ(allocation.nDebugStreamSize, 8);
-  EXPECT_EQ(allocation.nDatalogStreamSize, 2);
-  allocation.setDebugStreamPercentage(std::nanf(""));
-  EXPECT_EQ(allocation.nDebugStreamSize, 0);
-  EXPECT_EQ(allocation.nDatalogStreamSize, 10);
-
   // Sums beyond 32 bits neither overflow nor wrap.
   allocation.nDatalogStreamSize = INT_MAX;
   allocation.nDebugStreamSize = INT_MAX;
   allocation.setDebugStreamPercentage(0.5f);
   EXPECT_GT(allocation.nDebugStreamSize, 0);
-  EXPECT_EQ(allocation.nDebugStreamSize % 4, 0);
   EXPECT_GT(allocation.nDatalogStreamSize, 0);
 
-  // The even split while either stream is automatic or both are empty.
-  allocation.nDatalogStreamSize = -1;
-  allocation.nDebugStreamSize = 100;
-  EXPECT_EQ(allocation.getDebugStreamPercentage(), 0.5f);
-  allocation.nDatalogStreamSize = 100;
-  allocation.nDebugStreamSize = -1;
-  EXPECT_EQ(allocation.getDebugStreamPercentage(), 0.5f);
-  allocation.nDatalogStreamSize = 0;
-  allocation.nDebugStreamSize = 0;
-  EXPECT_EQ(allocation.getDebugStreamPercentage(), 0.5f);
-}
-
-TEST_F(MemorySettings, AutomaticSizing) {
-  TMemoryAllocation allocation;
   const struct {
     int nDatalog, nDebug;
     bool bAuto;
-  } kCases[] = {{-1, 100, true}, {100, -1, true}, {100, 104, true}, {104, 100, true},
-                {100, 105, false}, {105, 100, false}, {0, 0, true}, {INT_MAX, 0, false}};
+    float fShare;
+  } kCases[] = {{-1, 100, true, 0.5f},  {100, -1, true, 0.5f},    {100, 104, true, 0.5f}, {104, 100, true, 0.49f},
+                {100, 105, false, 0.51f}, {105, 100, false, 0.48f}, {0, 0, true, 0.5f},     {INT_MAX, 0, false, 0.f}};
   for (const auto &test : kCases) {
     allocation.nDatalogStreamSize = test.nDatalog;
     allocation.nDebugStreamSize = test.nDebug;
     EXPECT_EQ(allocation.bAutoSizeStreams(), test.bAuto) << test.nDatalog << " " << test.nDebug;
+    EXPECT_NEAR(allocation.getDebugStreamPercentage(), test.fShare, 0.01f) << test.nDatalog << " " << test.nDebug;
   }
-
   allocation.nDefaultTaskStackSize = 400;
-  allocation.nRequestedTaskStackSize = -1;
-  EXPECT_TRUE(allocation.bAutoSizeTaskStack());
-  allocation.nRequestedTaskStackSize = 400;
-  EXPECT_TRUE(allocation.bAutoSizeTaskStack());
-  allocation.nRequestedTaskStackSize = 0;
-  EXPECT_FALSE(allocation.bAutoSizeTaskStack());
-  allocation.nRequestedTaskStackSize = 512;
-  EXPECT_FALSE(allocation.bAutoSizeTaskStack());
+  for (const auto &[nRequested, bAuto] : {std::pair<int, bool>{-1, true}, {400, true}, {0, false}, {512, false}}) {
+    allocation.nRequestedTaskStackSize = nRequested;
+    EXPECT_EQ(allocation.bAutoSizeTaskStack(), bAuto) << nRequested;
+  }
 }
 
 TEST_F(MemorySettings, RamMap) {
   selectHostPlatform(platformNxt);  // 10 tasks of 400, datalog 5000, debug 1000, function stack 2048
   TRamMemoryLimits limits;
+  limits.nOtherRamSize = 77;
   limits.loadDefaultMemorySettings();
+  EXPECT_EQ(limits.nOtherRamSize, 77);  // the host's own
+  limits.nOtherRamSize = 0;
 
-  // No task count: the platform's tasks and stacks, and the platform's stream split.
   TMemoryAllocation allocation;
-  allocation.calculateDerivedValues(limits);
-  EXPECT_EQ(allocation.nTotalRam, 10000);
-  EXPECT_EQ(allocation.nTotalTaskStack, 4000);
-  EXPECT_EQ(allocation.nDatalogStreamSize, 5000);
-  EXPECT_EQ(allocation.nDebugStreamSize, 1000);
-  EXPECT_EQ(allocation.nTotalUsed, 10000);
+  auto expectMap = [&](int nTotal, int nStack, int nDatalog, int nDebug) {
+    allocation.calculateDerivedValues(limits);
+    EXPECT_EQ(allocation.nTotalRam, nTotal);
+    EXPECT_EQ(allocation.nTotalTaskStack, nStack);
+    EXPECT_EQ(allocation.nDatalogStreamSize, nDatalog);
+    EXPECT_EQ(allocation.nDebugStreamSize, nDebug);
+    EXPECT_EQ(allocation.nTotalUsed, nTotal);
+  };
+  expectMap(10000, 4000, 5000, 1000);  // no task count: the platform's tasks, stacks and split
 
   // The program's own split, tasks and fixed RAM.
   allocation.nNumbOfTasks = 4;
@@ -208,12 +141,7 @@ TEST_F(MemorySettings, RamMap) {
   allocation.nDatalogStreamSize = 300;
   allocation.nDebugStreamSize = 100;
   limits.nOtherRamSize = 1000;
-  allocation.calculateDerivedValues(limits);
-  EXPECT_EQ(allocation.nTotalRam, 11000);
-  EXPECT_EQ(allocation.nTotalTaskStack, 4 * 1000);  // 4000 / 4 tasks
-  EXPECT_EQ(allocation.nDatalogStreamSize, 4875);   // 0.75 of 11000 - 500 - 4000
-  EXPECT_EQ(allocation.nDebugStreamSize, 1625);
-  EXPECT_EQ(allocation.nTotalUsed, 11000);
+  expectMap(11000, 4000, 4875, 1625);  // 0.75 of 11000 - 500 - 4000
 
   // One task may not take more than the largest function stack; a requested stack wins.
   allocation.nNumbOfTasks = 1;
@@ -223,7 +151,6 @@ TEST_F(MemorySettings, RamMap) {
   allocation.nRequestedTaskStackSize = 256;
   allocation.calculateDerivedValues(limits);
   EXPECT_EQ(allocation.nTotalTaskStack, 768);
-  // Without a task count a requested stack changes nothing.
   allocation.nNumbOfTasks = 0;
   allocation.calculateDerivedValues(limits);
   EXPECT_EQ(allocation.nTotalTaskStack, 4000);
@@ -233,20 +160,12 @@ TEST_F(MemorySettings, RamMap) {
   limits = TRamMemoryLimits();
   limits.loadDefaultMemorySettings();
   allocation = TMemoryAllocation();
-  allocation.calculateDerivedValues(limits);
-  EXPECT_EQ(allocation.nTotalRam, 768);
-  EXPECT_EQ(allocation.nTotalTaskStack, 512);
-  EXPECT_EQ(allocation.nDatalogStreamSize, 0);
-  EXPECT_EQ(allocation.nDebugStreamSize, 256);
-  EXPECT_EQ(allocation.nTotalUsed, 768);
+  expectMap(768, 512, 0, 256);
 
   // No streams at all, and sizes at the ends of the 32-bit range.
   limits = TRamMemoryLimits();
   allocation = TMemoryAllocation();
-  allocation.calculateDerivedValues(limits);
-  EXPECT_EQ(allocation.nTotalRam, 0);
-  EXPECT_EQ(allocation.nDatalogStreamSize, 0);
-  EXPECT_EQ(allocation.nDebugStreamSize, 0);
+  expectMap(0, 0, 0, 0);
   limits.nNumbOfTasks = INT_MAX;
   limits.nDefaultTaskStackSize = INT_MAX;
   limits.nDefaultDatalogStreamSize = INT_MAX;
