@@ -102,7 +102,7 @@ TEST_F(MemorySettings, StreamSplitAndAutomaticSizing) {
     bool bAuto;
     float fShare;
   } kCases[] = {{-1, 100, true, 0.5f},  {100, -1, true, 0.5f},    {100, 104, true, 0.5f}, {104, 100, true, 0.49f},
-                {100, 105, false, 0.51f}, {105, 100, false, 0.48f}, {0, 0, true, 0.5f},     {INT_MAX, 0, false, 0.f}};
+                {100, 105, false, 0.51f}, {105, 100, false, 0.48f}, {0, 0, true, 0.5f},     {0, 100, false, 1.f},   {INT_MAX, 0, false, 0.f}};
   for (const auto &test : kCases) {
     allocation.nDatalogStreamSize = test.nDatalog;
     allocation.nDebugStreamSize = test.nDebug;

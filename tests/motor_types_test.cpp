@@ -30,44 +30,27 @@ std::wstring defaultName(const CRobotConfigurationBasic &rec, int nMotor, bool b
 }
 
 TEST_F(MotorRules, CharacteristicsDependOnPlatformAndToggle) {
-  selectHostPlatform(platformArduino);
-  EXPECT_EQ(typesWithRows(), (std::set<int>{0, 1, 2, 3, 5, 16, 22, 23, 24, 25, 29}));
-  EXPECT_EQ(getMotorCharacteristics(17), nullptr);
-  EXPECT_EQ(resolveMotorTypeForPlatform(17), 3);
-
-  selectHostPlatform(platformKind9);
-  EXPECT_EQ(typesWithRows(), (std::set<int>{0, 2, 3, 4, 5, 26, 29}));
-  EXPECT_EQ(resolveMotorTypeForPlatform(17), 0);  // its replacement 15 has no row either
-
-  selectHostPlatform(platformNxt);
-  EXPECT_EQ(typesWithRows(), (std::set<int>{0, 17, 20, 21, 26, 27, 28, 29}));
-  ASSERT_NE(getMotorCharacteristics(26), nullptr);
-  EXPECT_EQ(getMotorCharacteristics(26)->bDefaultEncoder, 1);
+  struct TCase {
+    int nKind;
+    bool bToggle;
+    std::set<int> types;
+  } kCases[] = {
+      {platformArduino, false, {0, 1, 2, 3, 5, 16, 22, 23, 24, 25, 29}},
+      {platformKind9, false, {0, 2, 3, 4, 5, 26, 29}},
+      {platformNxt, false, {0, 17, 20, 21, 26, 27, 28, 29}},
+      {platformNxt, true, {0, 2, 3, 17, 20, 21, 26, 27, 28, 29, 30, 31}},  // the toggle guards rows
+  };
+  for (const TCase &c : kCases) {
+    selectHostPlatform(c.nKind, -1, c.bToggle);
+    EXPECT_EQ(typesWithRows(), c.types) << c.nKind << " " << c.bToggle;
+  }
   EXPECT_EQ(getRawMotorCharacteristics(26), getMotorCharacteristics(26));
-  // The toggle guards rows on the same platform: the lookup must follow it.
-  setHostExternalControllers(true);
-  EXPECT_EQ(typesWithRows(), (std::set<int>{0, 2, 3, 17, 20, 21, 26, 27, 28, 29, 30, 31}));
-  setHostExternalControllers(false);
-  EXPECT_EQ(getMotorCharacteristics(30), nullptr);
-
-  selectHostPlatform(platformVexI2c);
-  ASSERT_NE(getMotorCharacteristics(26), nullptr);
-  EXPECT_EQ(getMotorCharacteristics(26)->bDefaultEncoder, 0);
-
   for (int nKind = 0; nKind < kNumbOfPlatformKinds; ++nKind) {
-    SCOPED_TRACE(nKind);
     selectHostPlatform(nKind);
-    const bool bRowsForTwoPinTypes = ((1u << nKind) & 0x29Cu) != 0;
-    EXPECT_EQ(getMotorCharacteristics(2) != nullptr, bRowsForTwoPinTypes);
-    EXPECT_EQ(getMotorCharacteristics(3) != nullptr, bRowsForTwoPinTypes);
-    EXPECT_EQ(getMotorCharacteristics(30), nullptr);
-    EXPECT_EQ(getMotorCharacteristics(31), nullptr);
+    EXPECT_EQ(getMotorCharacteristics(2) != nullptr, ((1u << nKind) & 0x29Cu) != 0) << nKind;
     EXPECT_EQ(getMotorCharacteristics(-1), nullptr);
     EXPECT_EQ(getMotorCharacteristics(32), nullptr);
-    for (int nType = 0; nType < kNumbOfMotorTypes; ++nType) {
-      ASSERT_NE(getMotorConversion(nType), nullptr);
-      EXPECT_EQ(getMotorConversion(nType)->nSourceType, nType);
-    }
+    for (int nType = 0; nType < kNumbOfMotorTypes; ++nType) EXPECT_EQ(getMotorConversion(nType)->nSourceType, nType);
   }
 }
 
@@ -119,53 +102,29 @@ TEST_F(MotorRules, DefaultTypes) {
 TEST_F(MotorRules, LegacyTypesAreNormalised) {
   selectHostPlatform(platformNxt, -1, true);
   CHostRobotConfiguration rec;
-  auto normalise = [&rec](TMotorTypes nType, bool bEncoder) {
+  struct TCase {
+    TMotorTypes nType;
+    bool bEncoder;
+    TMotorTypes nNewType;
+    bool bPID, bReversed, bNewEncoder;
+  } kCases[] = {
+      {28, false, 17, true, false, false}, {29, true, 17, false, true, true}, {26, true, 17, false, false, true},
+      {31, true, 20, true, false, true},    {15, true, 0, false, false, true}, {-1, true, 0, false, false, true},
+      {20, false, 20, true, true, false},  // modern types keep their flags
+  };
+  for (const TCase &c : kCases) {
     TMotorSlot &motor = rec.settings.motors[5];
-    motor.nMotorType = nType;
-    motor.bEncoder = bEncoder;
+    motor = TMotorSlot{};
+    motor.nMotorType = c.nType;
+    motor.bEncoder = c.bEncoder;
     motor.bPIDControlled = true;
     motor.bReversed = true;
     rec.normalizeLegacyMotorConfiguration(5);
-    return motor;
-  };
-  TMotorSlot m = normalise(28, false);
-  EXPECT_EQ(m.nMotorType, 17);
-  EXPECT_TRUE(m.bPIDControlled);
-  EXPECT_FALSE(m.bReversed);
-  EXPECT_FALSE(m.bEncoder);
-
-  m = normalise(29, true);
-  EXPECT_EQ(m.nMotorType, 17);
-  EXPECT_FALSE(m.bPIDControlled);
-  EXPECT_TRUE(m.bReversed);
-  EXPECT_TRUE(m.bEncoder);
-
-  m = normalise(26, true);
-  EXPECT_EQ(m.nMotorType, 17);
-  EXPECT_FALSE(m.bPIDControlled);
-
-  m = normalise(31, true);
-  EXPECT_EQ(m.nMotorType, 20);
-  EXPECT_TRUE(m.bPIDControlled);
-
-  for (const TMotorTypes nType : {15, -1, 40}) {
-    m = normalise(nType, true);
-    EXPECT_EQ(m.nMotorType, 0) << nType;
-    EXPECT_FALSE(m.bPIDControlled);
-    EXPECT_FALSE(m.bReversed);
+    EXPECT_EQ(motor.nMotorType, c.nNewType) << c.nType;
+    EXPECT_EQ(motor.bPIDControlled, c.bPID) << c.nType;
+    EXPECT_EQ(motor.bReversed, c.bReversed) << c.nType;
+    EXPECT_EQ(motor.bEncoder, c.bNewEncoder) << c.nType;
   }
-
-  // Modern types keep their flags; the plain types take their row's defaults.
-  m = normalise(20, false);
-  EXPECT_EQ(m.nMotorType, 20);
-  EXPECT_TRUE(m.bPIDControlled);
-  EXPECT_TRUE(m.bReversed);
-  selectHostPlatform(platformVexPic);
-  rec.clearConfigurationDefinition();
-  m = normalise(5, false);
-  EXPECT_EQ(m.nMotorType, 5);
-  EXPECT_TRUE(m.bReversed);
-  EXPECT_FALSE(m.bPIDControlled);
 }
 
 TEST_F(MotorRules, SettingATypeResetsFlagsAndFreesDriveTrainSlots) {

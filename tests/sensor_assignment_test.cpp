@@ -138,12 +138,7 @@ TEST_F(SensorAssignment, ModeAndNameAccessorsHaveNoSideEffects) {
 
   rec.getDefaultSensorNameInConfig(20, sName);
   EXPECT_EQ(sName, L"I2C_1");
-  EXPECT_EQ(str(rec.getSensorPortString(8)), L"dgtl1");
-  EXPECT_EQ(str(rec.getSensorPortString(-1)), L"None");
   EXPECT_EQ(str(rec.getSensorPortString(28)), L"");
-  EXPECT_EQ(getDefaultSensorModeForSensorType(0), 0);
-  EXPECT_EQ(getDefaultSensorModeForSensorType(49), 0);
-  EXPECT_EQ(getDefaultSensorModeForSensorType(91), 0);
 }
 
 TEST_F(SensorAssignment, SerialPinsReleaseTheirPort) {
@@ -214,18 +209,12 @@ TEST_F(SensorAssignment, SensorOnASharedMotorPortReplacesTheMotor) {
 }
 
 TEST_F(SensorAssignment, SensorPortCount) {
-  select(platformArduino, 0);
-  EXPECT_EQ(rec.getMaxNumbOfSensorPorts(), 70);
-  select(platformArduino, 8);
-  EXPECT_EQ(rec.getMaxNumbOfSensorPorts(), 20);
-  select(platformArduino, 13);
-  EXPECT_EQ(rec.getMaxNumbOfSensorPorts(), 70);
-  select(platformVexI2c);
-  EXPECT_EQ(rec.getMaxNumbOfSensorPorts(), 28);
-  select(platformBoard10);  // board counts apply on the Arduino platform only
-  EXPECT_EQ(rec.getMaxNumbOfSensorPorts(), 24);
-  select(platformKind6);
-  EXPECT_EQ(rec.getMaxNumbOfSensorPorts(), 4);
+  // Board counts apply on the Arduino platform only.
+  for (const auto &[nKind, nBoard, nPorts] : {std::array<int, 3>{platformArduino, 0, 70}, {platformArduino, 8, 20},
+                                              {platformVexI2c, -1, 28}, {platformBoard10, -1, 24}}) {
+    select(nKind, nBoard);
+    EXPECT_EQ(rec.getMaxNumbOfSensorPorts(), nPorts) << nKind << ":" << nBoard;
+  }
 }
 
 TEST_F(SensorAssignment, HubPortsAreTypedFromTheHubTable) {
@@ -341,25 +330,6 @@ TEST_F(SensorAssignment, UnusedVexI2CEncodersAreCleared) {
   EXPECT_EQ(type(3), 67);
 }
 
-TEST_F(SensorAssignment, DriveSideMenuTable) {
-  select(platformNxt);
-  const wchar_t *const kWords[] = {L"None", L"Left", L"Right"};
-  for (int n = 0; n < 3; ++n) {
-    const TDeviceTypeMenuItem &row = nDriveSideMenu[n];
-    EXPECT_EQ(row.nPlatformMask, 0xFFFFFFFFu);
-    EXPECT_EQ(row.nValue, n);
-    EXPECT_EQ(str(row.pzKeyword), kWords[n]);
-    EXPECT_EQ(row.pzLabel, nullptr);
-    EXPECT_EQ(row.nThirdPartyMask, 0xFE);
-    EXPECT_EQ(row.nRowAttribute, 0);
-    EXPECT_EQ(getTypedefIndex(nDriveSideMenu, kWords[n], true), n);
-  }
-  EXPECT_EQ(nDriveSideMenu[3].nPlatformMask, 0u);
-  EXPECT_EQ(nDriveSideMenu[3].pzKeyword, nullptr);
-  EXPECT_EQ(getTypedefIndex(nDriveSideMenu, L"left", true), -1);
-  EXPECT_EQ(str(getTypedefEnumString(nDriveSideMenu, 2, -1)), L"Right");
-}
-
 TEST_F(SensorAssignment, SensorPortMenuAndLookupsFollowTheBoard) {
   select(platformArduino, 8);
   CDropDownButtonOfDeviceTypeMenuItem button, other;
@@ -396,7 +366,8 @@ TEST_F(SensorAssignment, SensorPortMenuAndLookupsFollowTheBoard) {
   EXPECT_EQ(rec.getIndexForJoystickScalingType(L"axisScalingCubed"), 2);
   EXPECT_EQ(rec.getIndexForGripperArmType(L"gripperClawLift"), 2);
   EXPECT_LT(rec.getIndexForDriveTrainType(L"tankDrive"), 0);
-  EXPECT_LT(rec.getIndexForGripperArmType(L"GripperClawLift"), 0);
+  EXPECT_EQ(getTypedefIndex(nDriveSideMenu, L"Right", true), 2);
+  EXPECT_EQ(getTypedefIndex(nDriveSideMenu, L"left", true), -1);
 }
 
 }  // namespace

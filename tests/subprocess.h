@@ -148,46 +148,20 @@ inline std::string visibleLine(const std::string &sLine) {
   return sOut;
 }
 
-/// Lines including their line feed (the last one may lack it).
-inline std::vector<std::string> splitLines(const std::string &sText) {
-  std::vector<std::string> lines;
-  size_t nStart = 0;
-  while (nStart < sText.size()) {
-    const size_t nEnd = sText.find('\n', nStart);
-    const size_t nNext = nEnd == std::string::npos ? sText.size() : nEnd + 1;
-    lines.push_back(sText.substr(nStart, nNext - nStart));
-    nStart = nNext;
-  }
-  return lines;
-}
-
-/// A line diff of two texts ("-" expected, "+" actual, " " both), empty when
-/// they are equal. A line without a final line feed is marked.
+/// Both texts line by line ("-" expected, "+" actual) from the first line
+/// that differs, empty when they are equal.
 inline std::string lineDiff(const std::string &sExpected, const std::string &sActual) {
   if (sExpected == sActual) return {};
-  const std::vector<std::string> a = splitLines(sExpected), b = splitLines(sActual);
-  // Longest common subsequence table over the lines.
-  std::vector<std::vector<size_t>> lcs(a.size() + 1, std::vector<size_t>(b.size() + 1, 0));
-  for (size_t i = a.size(); i-- > 0;)
-    for (size_t j = b.size(); j-- > 0;)
-      lcs[i][j] = a[i] == b[j] ? lcs[i + 1][j + 1] + 1 : std::max(lcs[i + 1][j], lcs[i][j + 1]);
-  auto shown = [](char cPrefix, const std::string &sLine) {
-    const bool bEol = !sLine.empty() && sLine.back() == '\n';
-    return cPrefix + visibleLine(bEol ? sLine.substr(0, sLine.size() - 1) : sLine) +
-           (bEol ? "\n" : "\n\\ No newline at end of text\n");
-  };
-  std::string sOut = "--- expected\n+++ actual\n";
-  size_t i = 0, j = 0;
-  while (i < a.size() || j < b.size()) {
-    if (i < a.size() && j < b.size() && a[i] == b[j]) {
-      sOut += shown(' ', a[i++]);
-      ++j;
-    } else if (i < a.size() && (j == b.size() || lcs[i + 1][j] >= lcs[i][j + 1])) {
-      sOut += shown('-', a[i++]);
-    } else {
-      sOut += shown('+', b[j++]);
+  size_t nSame = 0;
+  for (size_t i = 0; i < std::min(sExpected.size(), sActual.size()) && sExpected[i] == sActual[i]; ++i)
+    if (sExpected[i] == '\n') nSame = i + 1;
+  std::string sOut = "--- expected\n+++ actual (from the first differing line)\n";
+  for (const auto &[cPrefix, sText] : {std::pair<char, std::string>{'-', sExpected.substr(nSame)}, {'+', sActual.substr(nSame)}})
+    for (size_t nStart = 0; nStart < sText.size();) {
+      const size_t nEnd = std::min(sText.find('\n', nStart), sText.size());
+      sOut += cPrefix + visibleLine(sText.substr(nStart, nEnd - nStart)) + "\n";
+      nStart = nEnd + 1;
     }
-  }
   return sOut;
 }
 
