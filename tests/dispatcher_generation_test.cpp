@@ -10,6 +10,7 @@
 #include "robotconfig/host/DeviceCatalog.h"
 #include "robotconfig/program/HostConfiguration.h"
 #include "robotconfig/host/Platform.h"
+#include "robotconfig/program/StandardModelList.h"
 #include "tests/subprocess.h"
 #include "tests/config_lines.h"
 
@@ -230,6 +231,21 @@ TEST_F(ConfigurationText, DatalogSeriesRoundTrip) {
   readBlock(copy, kQuoted + L"\r\n" + L"#pragma config(DatalogSeries, 1, Battery2)\r\n");
   EXPECT_EQ(copy.compareConfiguration(rec), configCompareSettingsDiffer);
   EXPECT_EQ(rec.compareConfiguration(copy), configCompareSettingsDiffer);
+}
+
+TEST_F(ConfigurationText, FirstWordsOfTheirTablesAreAccepted) {
+  selectHostPlatform(platformVexI2c);
+  CHostRobotConfiguration rec;
+  CString sError;
+  EXPECT_TRUE(parseLine(rec, L"#pragma config(JoystickDrive, arcadeDriveLeftStick, axisScalingLinear)", sError));
+  EXPECT_EQ(sError, L"");
+  EXPECT_EQ(rec.getJoystickMotorDriveType(), 2);
+
+  // A model added to an empty list is its first.
+  CHostStandardModelList list;
+  list.removeAllModels();
+  EXPECT_TRUE(list.bAddModel(L"Mine", rec));
+  EXPECT_EQ(list.findModelIndex(L"Mine"), 0);
 }
 
 }  // namespace

@@ -111,6 +111,7 @@ TEST_F(SensorAssignment, SameTypeChangesNothingAndPortsOutsideTheRecordAreIgnore
     rec.setSecondaryPort(nPort, 3);
     rec.setUserDefinedSensorNameInConfig(nPort, L"x", TLineNumber(1, 0));
     rec.updateDefaultSensorNameForPlatformOrControllerBoard(nPort, L"x");
+    rec.setDefaultServoNameToEmpty(nPort);
   }
   EXPECT_EQ(std::memcmp(&before, &rec.getSettings(), sizeof before), 0);
 }
@@ -308,12 +309,13 @@ TEST_F(SensorAssignment, UnusedVexI2CEncodersAreCleared) {
   rec.setSensorTypeInConfig(20, 67);
   rec.setSensorTypeInConfig(21, 67);
   rec.setSensorTypeInConfig(22, 68);
+  rec.settings.nSensorTypes[0] = 67;
   rec.setMotorTypeInConfig(1, 11);
   rec.settings.motors[1].nEncoderPort = 20;
   rec.settings.motors[4].nEncoderPort = 21;  // a port without a motor type does not count
   rec.clearUnusedVexI2CEncoders();
   EXPECT_EQ(type(20), 67);
-  EXPECT_EQ(type(21), 0);
+  EXPECT_EQ(type(21) + type(0), 0);
   EXPECT_EQ(type(22), 68);
   EXPECT_EQ(rec.settings.motors[4].nEncoderPort, -1);
   EXPECT_EQ(rec.settings.nI2CMode[0], 2);

@@ -100,43 +100,19 @@ TEST_F(SerialPorts, DefaultUsesAndBaudRates) {
   EXPECT_EQ(rec.getUARTType(0), 2);
 }
 
-TEST_F(SerialPorts, PinMapsBothWays) {
+TEST_F(SerialPorts, PinMapsAndClaimedPins) {
   select(platformArduino, kMega);
   EXPECT_TRUE(rec.bCanSystemUartPortBeReconfigured());
   int nFirst = 0, nSecond = 0, nPort = 0;
   EXPECT_EQ(rec.getUARTPortIOPinDefinition(1), &getCircuitBoardInfo(kMega)->pSerialPorts->uartPins[1]);
-  EXPECT_EQ(rec.getI2CPortIOPinDefinition(0), &getCircuitBoardInfo(kMega)->pSerialPorts->i2cPins[0]);
   EXPECT_TRUE(rec.findUartFromPin(34, nPort, nFirst, nSecond));
-  EXPECT_EQ(nPort, 1);
-  EXPECT_EQ(nFirst, 35);
-  EXPECT_EQ(nSecond, 34);
+  EXPECT_EQ(std::vector<int>({nPort, nFirst, nSecond}), std::vector<int>({1, 35, 34}));
   // A pin of no port: port -1, and the pins those of port 0 (the search ends there).
   EXPECT_FALSE(rec.findUartFromPin(20, nPort, nFirst, nSecond));
-  EXPECT_EQ(nPort, -1);
-  EXPECT_EQ(nFirst, 16);
-  EXPECT_EQ(nSecond, 17);
+  EXPECT_EQ(std::vector<int>({nPort, nFirst, nSecond}), std::vector<int>({-1, 16, 17}));
   for (const int port : {-1, 4, 6}) EXPECT_EQ(rec.getUARTPortIOPinDefinition(port), nullptr) << port;
   EXPECT_EQ(rec.getI2CPortIOPinDefinition(1), nullptr);
 
-  // A board counting 8 UARTs: six usable, the other two have neither pins nor a record.
-  select(platformArduino, kMegaExpansion);
-  EXPECT_EQ(rec.getMaxNumbOfUARTPorts(), 6);
-  for (const int port : {6, 7}) {
-    rec.getMapUARTPortToIOPins(port, nFirst, nSecond);
-    EXPECT_EQ(nFirst, -1);
-    EXPECT_EQ(rec.getUARTPortIOPinDefinition(port), nullptr);
-  }
-
-  select(platformNxt);
-  EXPECT_EQ(rec.getUARTPortIOPinDefinition(0), nullptr);
-  EXPECT_FALSE(rec.bCanSystemUartPortBeReconfigured());
-  select(platformVexI2c);
-  EXPECT_FALSE(rec.bCanSystemUartPortBeReconfigured());
-  EXPECT_NE(rec.getUARTPortIOPinDefinition(2), nullptr);
-}
-
-TEST_F(SerialPorts, ClaimingAndReleasingPins) {
-  select(platformArduino, kMega);
   // Pin 35 carries a touch sensor and serves as motor 0's encoder.
   rec.setSensorTypeInConfig(35, kTouch);
   rec.setSensorModeInConfig(35, 1);
@@ -148,42 +124,24 @@ TEST_F(SerialPorts, ClaimingAndReleasingPins) {
   EXPECT_EQ(rec.getSensorTypeInConfig(34), kUartPin);
   EXPECT_EQ(rec.getMapEncoderToMotor(0), -1);
   EXPECT_FALSE(rec.getMotorEncoderInConfig(0));
-
-  // Claiming again changes nothing.
-  TConfigurationSettings before = rec.getSettings();
-  rec.setUartIOPinsInConfig(1);
-  EXPECT_TRUE(bSettingsUnchanged(before));
-
   // Releasing frees both pins and the port.
   rec.setUARTType(1, 4);
   rec.setUartIOPinsInConfigNone(1);
-  EXPECT_EQ(rec.getSensorTypeInConfig(35), 0);
-  EXPECT_EQ(rec.getSensorTypeInConfig(34), 0);
-  EXPECT_EQ(rec.getUARTType(1), 0);
-
+  EXPECT_EQ(rec.getSensorTypeInConfig(35) + rec.getSensorTypeInConfig(34) + rec.getUARTType(1), 0);
   // Releasing a port whose first pin holds something else leaves everything alone.
-  rec.setUartIOPinsInConfig(2);
-  rec.setUARTType(2, 2);
-  rec.setSensorTypeInConfig(33, kTouch);  // takes the port's first pin, which releases the port
-  EXPECT_EQ(rec.getUARTType(2), 0);
-  EXPECT_EQ(rec.getSensorTypeInConfig(32), 0);
   rec.setUartIOPinsInConfig(3);
   rec.setSensorTypeInConfig(31, kTouch);
   rec.setSensorTypeInConfig(30, kUartPin);
-  before = rec.getSettings();
+  TConfigurationSettings before = rec.getSettings();
   rec.setUartIOPinsInConfigNone(3);
   EXPECT_TRUE(bSettingsUnchanged(before));
-
   // I2C: both pins are claimed and released, the mode with them.
   rec.settings.nI2CMode[0] = 1;
   rec.setI2CIOPinsInConfig(0);
   EXPECT_EQ(rec.getSensorTypeInConfig(36), kI2CPin);
   EXPECT_EQ(rec.getSensorTypeInConfig(37), kI2CPin);
   rec.setI2CIOPinsInConfigNone(0);
-  EXPECT_EQ(rec.getSensorTypeInConfig(36), 0);
-  EXPECT_EQ(rec.getSensorTypeInConfig(37), 0);
-  EXPECT_EQ(rec.getSettings().nI2CMode[0], 0);
-
+  EXPECT_EQ(rec.getSensorTypeInConfig(36) + rec.getSensorTypeInConfig(37) + rec.getSettings().nI2CMode[0], 0);
   // Ports outside the board change nothing.
   before = rec.getSettings();
   for (const int port : {-1, 4, 6, 1000}) {
@@ -194,12 +152,22 @@ TEST_F(SerialPorts, ClaimingAndReleasingPins) {
   }
   EXPECT_TRUE(bSettingsUnchanged(before));
 
+  // A board counting 8 UARTs: six usable, the other two have neither pins nor a record.
+  select(platformArduino, kMegaExpansion);
+  EXPECT_EQ(rec.getMaxNumbOfUARTPorts(), 6);
+  rec.getMapUARTPortToIOPins(7, nFirst, nSecond);
+  EXPECT_EQ(nFirst, -1);
+  EXPECT_EQ(rec.getUARTPortIOPinDefinition(6), nullptr);
   // Ports wired to no pins claim nothing.
   select(platformVexI2c);
+  EXPECT_FALSE(rec.bCanSystemUartPortBeReconfigured());
   before = rec.getSettings();
   rec.setUartIOPinsInConfig(1);
   rec.setI2CIOPinsInConfig(0);
   EXPECT_TRUE(bSettingsUnchanged(before));
+  rec.settings.nCircuitBoardType = 99;  // no board of the catalog: no port, no pins
+  EXPECT_FALSE(rec.findUartFromPin(3, nPort, nFirst, nSecond));
+  EXPECT_EQ(std::vector<int>({nPort, nFirst, nSecond}), std::vector<int>({-1, -1, -1}));
 }
 
 TEST_F(SerialPorts, ReadingUartLines) {
