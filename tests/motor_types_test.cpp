@@ -8,6 +8,7 @@
 #include "robotconfig/program/HostConfiguration.h"
 #include "robotconfig/host/Platform.h"
 #include "robotconfig/motors/MotorTypes.h"
+#include "tests/config_lines.h"
 
 namespace {
 
@@ -171,44 +172,30 @@ TEST_F(MotorRules, HubMotorAndServoNumbering) {
   selectHostPlatform(platformNxt);
   CHostRobotConfiguration rec;
   rec.settings.nSensorPortHubs[0] = {hubHTMotor, hubHTMotor, hubNone, hubHTMotor};
-  for (int n = 0; n <= 6; ++n) EXPECT_TRUE(rec.bIsValidMotorPort(n)) << n;
-  EXPECT_FALSE(rec.bIsValidMotorPort(7));  // behind the end of the chain
-  EXPECT_FALSE(rec.bIsValidMotorPort(9));
-  EXPECT_FALSE(rec.bIsValidMotorPort(-1));
+  for (int n = -1; n <= 9; ++n) EXPECT_EQ(rec.bIsValidMotorPort(n), n >= 0 && n <= 6) << n;  // the chain ends at none
   EXPECT_EQ(rec.getDeviceIndexOnMotorHub(hubHTMotor, 0, 1, 1), 6);
   EXPECT_EQ(rec.getDeviceIndexOnMotorHub(hubHTServo, 0, 1, 1), -1);
   EXPECT_EQ(rec.getMotorMuxForMotor(6), hubHTMotor);
   EXPECT_EQ(rec.getMotorMuxForMotor(7), hubNone);
-  EXPECT_EQ(rec.getMotorMuxForMotor(2), hubNone);
-
   // A chain that starts empty holds no motors, though the port holds a controller.
   rec.settings.nSensorPortHubs[0] = {hubNone, hubHTMotor, hubNone, hubNone};
-  for (int n = 3; n <= 10; ++n) EXPECT_FALSE(rec.bIsValidMotorPort(n)) << n;
+  EXPECT_FALSE(rec.bIsValidMotorPort(3));
   EXPECT_TRUE(rec.bSensorPortContainsHiTechnicMux(0));
   EXPECT_FALSE(rec.bSensorPortContainsHiTechnicMux(1));
 
   selectHostPlatform(platformBrick4Motor);
   rec.clearConfigurationDefinition();
   rec.settings.nSensorPortHubs[1][0] = hubMatrxRbtcs;
-  for (int n = 12; n <= 15; ++n) EXPECT_TRUE(rec.bIsValidMotorPort(n)) << n;
-  EXPECT_FALSE(rec.bIsValidMotorPort(11));
-  EXPECT_FALSE(rec.bIsValidMotorPort(16));
-  EXPECT_EQ(rec.getMotorMuxForMotor(13), hubMatrxRbtcs);
+  for (int n = 11; n <= 16; ++n) EXPECT_EQ(rec.bIsValidMotorPort(n), n >= 12 && n <= 15) << n;
   EXPECT_EQ(rec.getDefaultMotorType(13), 21);
 
   selectHostPlatform(platformNxt, -1, true);
   rec.clearConfigurationDefinition();
   rec.settings.nSensorPortHubs[2] = {hubHTServo, hubHTServo, hubNone, hubNone};
-  EXPECT_FALSE(rec.bIsValidServoPort(47));
-  for (int n = 48; n <= 59; ++n) EXPECT_TRUE(rec.bIsValidServoPort(n)) << n;
-  EXPECT_FALSE(rec.bIsValidServoPort(60));
+  for (int n = 47; n <= 60; ++n) EXPECT_EQ(rec.bIsValidServoPort(n), n >= 48 && n <= 59) << n;
   setHostExternalControllers(false);
   EXPECT_FALSE(rec.bIsValidServoPort(48));
-
-  selectHostPlatform(platformVexPic);
-  EXPECT_EQ(rec.getDeviceIndexOnMotorHub(hubHTMotor, 0, 0, 0), -1);
   EXPECT_EQ(std::wstring(getMuxTypes(3)), L"MatrxRbtcs");
-  EXPECT_EQ(std::wstring(getMuxTypes(6)), L"none");
 }
 
 TEST_F(MotorRules, MotorIOPinsClaimSensorPorts) {
@@ -219,59 +206,48 @@ TEST_F(MotorRules, MotorIOPinsClaimSensorPorts) {
   EXPECT_EQ(rec.getSensorTypeInConfig(4), 58);
   EXPECT_EQ(rec.getMapMotorToPrimaryIOPin(2), 5);
   EXPECT_EQ(rec.getMapMotorToSecondaryIOPin(2), 4);
-
   rec.setSensorModeInConfig(5, 1);
   const TConfigurationSettings before = rec.getSettings();
   rec.setMotorIOPinsInConfig(2, 5, 4, false);
   EXPECT_EQ(std::memcmp(&before, &rec.getSettings(), sizeof before), 0);
-
   // Moving one pin frees only that pin.
   rec.setMotorIOPinsInConfig(2, 8, 4, false);
   EXPECT_EQ(rec.getSensorTypeInConfig(5), 0);
   EXPECT_EQ(rec.getSensorTypeInConfig(8), 57);
   EXPECT_EQ(rec.getSensorTypeInConfig(4), 58);
-
   rec.setMotorIOPinsInConfigNone(2);
-  EXPECT_EQ(rec.getSensorTypeInConfig(8), 0);
-  EXPECT_EQ(rec.getSensorTypeInConfig(4), 0);
-  EXPECT_EQ(rec.getMapMotorToPrimaryIOPin(2), -1);
-  EXPECT_EQ(rec.getMapMotorToSecondaryIOPin(2), -1);
-
+  EXPECT_EQ(rec.getSensorTypeInConfig(8) + rec.getSensorTypeInConfig(4), 0);
+  EXPECT_EQ(rec.getMapMotorToPrimaryIOPin(2) + rec.getMapMotorToSecondaryIOPin(2), -2);
   rec.setMotorIOPinsInConfig(3, 9, 10, true);
   EXPECT_EQ(rec.getSensorTypeInConfig(9), 59);
   EXPECT_EQ(rec.getSensorTypeInConfig(10), 59);
 }
 
 TEST_F(MotorRules, DefaultMotorNames) {
-  selectHostPlatform(platformVexPic);
-  CHostRobotConfiguration rec;
-  EXPECT_EQ(defaultName(rec, 0, false), L"port1");
-  selectHostPlatform(platformSharedPorts);
-  EXPECT_EQ(defaultName(rec, 9, false), L"motor10");
-  selectHostPlatform(platformArduino);
-  EXPECT_EQ(defaultName(rec, 0, true), L"");
-
-  selectHostPlatform(platformBrick4Motor);
-  rec.clearConfigurationDefinition();
-  EXPECT_EQ(defaultName(rec, 3, false), L"motorD");
-  EXPECT_EQ(defaultName(rec, 4, true), L"");
-  rec.settings.nSensorPortHubs[0][0] = hubHTMotor;
-  EXPECT_EQ(defaultName(rec, 4, true), L"mtr_S1_C1_1");
-  EXPECT_EQ(defaultName(rec, 4, false), L"motorE");
-
+  struct TCase {
+    int nKind, nMotor;
+    bool bHubStyle;
+    const wchar_t *pzName;
+  } kCases[] = {{platformVexPic, 0, false, L"port1"},
+                {platformSharedPorts, 9, false, L"motor10"},
+                {platformArduino, 0, true, L""},
+                {platformBrick4Motor, 3, false, L"motorD"},
+                {platformBrick4Motor, 4, true, L""}};
+  for (const TCase &c : kCases) {
+    selectHostPlatform(c.nKind);
+    CHostRobotConfiguration rec;
+    EXPECT_EQ(defaultName(rec, c.nMotor, c.bHubStyle), c.pzName) << c.nKind << ":" << c.nMotor;
+  }
   // Lettered names run on without gaps over the hub motors that exist.
   selectHostPlatform(platformNxt);
-  rec.clearConfigurationDefinition();
+  CHostRobotConfiguration rec;
   rec.settings.nSensorPortHubs[0] = {hubHTMotor, hubHTMotor, hubNone, hubNone};
   rec.settings.nSensorPortHubs[1][0] = hubMatrxRbtcs;
-  const std::pair<int, const wchar_t *> kLettered[] = {{3, L"motorD"},  {4, L"motorE"},  {5, L"motorF"},
-                                                       {6, L"motorG"},  {7, L""},        {11, L"motorH"},
-                                                       {12, L"motorI"}, {13, L"motorJ"}, {14, L"motorK"},
-                                                       {15, L""}};
+  const std::pair<int, const wchar_t *> kLettered[] = {{3, L"motorD"},  {6, L"motorG"},  {7, L""},
+                                                       {11, L"motorH"}, {14, L"motorK"}, {15, L""}};
   for (const auto &[nMotor, pzName] : kLettered) EXPECT_EQ(defaultName(rec, nMotor, false), pzName) << nMotor;
   EXPECT_EQ(defaultName(rec, 5, true), L"mtr_S1_C2_1");
   EXPECT_EQ(defaultName(rec, 13, true), L"mtr_Matrix_S2_3");
-
   EXPECT_EQ(rec.getIndexForDefaultMotorName(L"motorB"), 1);
   EXPECT_EQ(rec.getIndexForDefaultMotorName(L""), -1);
   rec.setEmptyMotorNameToDefaultName(4);
@@ -298,3 +274,31 @@ TEST_F(MotorRules, DefaultMotorNames) {
 }
 
 }  // namespace
+
+namespace {
+
+// Each motor type of a platform as the record takes it: "type:" then P (PID
+// control), R (reversed), W (a Motor line is written for a bare motor).
+std::string typeDefaults(int nKind, bool bToggle) {
+  selectHostPlatform(nKind, -1, bToggle);
+  std::string sOut;
+  for (int nType = 1; nType < kNumbOfMotorTypes; ++nType) {
+    if (!getMotorCharacteristics(nType)) continue;
+    CHostRobotConfiguration rec;
+    rec.setMotorTypeInConfig(1, nType);
+    const TMotorSlot &motor = rec.getSettings().motors[1];
+    sOut += std::to_string(nType) + ":" + (motor.bPIDControlled ? "P" : "") + (motor.bReversed ? "R" : "") +
+            (test_support::generatedLines(rec, L"#pragma config(Motor,").empty() ? "" : "W") + " ";
+  }
+  return sOut;
+}
+
+}  // namespace
+
+TEST_F(MotorRules, TypeDefaultsPerPlatform) {
+  EXPECT_EQ(typeDefaults(platformVexPic, false), "2:W 3:W 4:RW 5:RW 10:W 11:W 12:W 13:W 26: 29:RW ");
+  EXPECT_EQ(typeDefaults(platformVexI2c, false), "2:W 3:W 4:RW 5:RW 6:W 7:W 8:W 9:W 10:W 11:W 12:W 13:W 26: 29:RW ");
+  EXPECT_EQ(typeDefaults(platformNxt, true), "2:W 3:W 17:P 20:W 21:W 26:W 27:W 28:P 29:RW 30:W 31:PW ");
+  EXPECT_EQ(typeDefaults(platformKind9, false), "2:W 3:W 4:RW 5:RW 26: 29:RW ");
+  EXPECT_EQ(typeDefaults(platformSharedPorts, false), "2:W 3:W 4:RW 5:RW 14:PW 26: 29:RW ");
+}

@@ -97,6 +97,7 @@ TEST_F(Networks, NumberTextsReadAndWriteEachOther) {
 
   // A node keeps 31 bytes of its name and never half a character ("\u00e9" takes two).
   Networking::TNode node;
+  EXPECT_EQ(nodeName(node), L"");
   const std::wstring sAccents(20, L'\u00E9');
   node.setNodeName(sAccents.c_str(), int(sAccents.size()));
   EXPECT_EQ(nodeName(node), sAccents.substr(0, 15));
