@@ -6,6 +6,8 @@
 #include <memory>
 
 #include "cli/Commands.h"
+#include "cli/InputFiles.h"
+#include "cli/Terminal.h"
 #include "robotconfig/checker/ProgramChecker.h"
 #include "robotconfig/host/Platform.h"
 #include "robotconfig/program/FileIO.h"
@@ -33,6 +35,11 @@ bool readAndCheckProgram(const std::string &sPath, const TOptions &options, TRea
   findings.sFile = displayName(sPath);
   findings.pProgram = program.pText.get();
   findings.findings = std::move(result.findings);
+  // Nothing chose the platform: say how to choose it once for a whole folder.
+  if (bPlatformUnchosen(sPath, options))
+    for (TFinding &finding : findings.findings)
+      if (finding.sCode == "RC501")
+        finding.sMessage += "; to set the platform of a folder, run 'robotcfg init --platform NAME' in it";
   if (options.bWarningsAreErrors)
     for (TFinding &finding : findings.findings)
       if (finding.nSeverity == TSeverity::kWarning) finding.nSeverity = TSeverity::kError;
@@ -50,7 +57,7 @@ void printFindingsText(const TFileFindings &findings, const TOptions &options) {
   // A caret excerpt helps a person at a terminal; logs and pipes get plain lines.
   textOptions.bShowSource = options.bShowSource || isatty(STDERR_FILENO);
   textOptions.bErrorsOnly = options.bQuiet;
-  const std::string sText = renderText(findings, textOptions);
+  const std::string sText = colouredDiagnostics(renderText(findings, textOptions));
   std::fwrite(sText.data(), 1, sText.size(), stderr);
 }
 
@@ -60,6 +67,7 @@ int runCheckCommand(const TOptions &options) {
   std::vector<TFileFindings> reports;
   for (size_t i = 0; i < options.files.size(); ++i) {
     TFileFindings findings;
+    selectPlatformForProgram(options.files[i], options);
     if (!readAndCheckProgram(options.files[i], options, programs[i], findings)) {
       nStatus = kExitUsage;
       continue;

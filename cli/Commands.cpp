@@ -3,7 +3,10 @@
 #include <cstdio>
 
 #include "cli/CheckReport.h"
+#include "cli/InputFiles.h"
 #include "cli/ReadProgram.h"
+#include "cli/Terminal.h"
+#include "cli/UnifiedDiff.h"
 #include "robotconfig/program/FileIO.h"
 #include "robotconfig/host/Platform.h"
 
@@ -51,6 +54,7 @@ int runFormat(const TOptions &options) {
   for (const std::string &sPath : options.files) {
     TReadProgram program;
     TFileFindings findings;
+    selectPlatformForProgram(sPath, options);
     if (!readAndCheckProgram(sPath, options, program, findings)) {
       fail(kExitUsage);
       continue;
@@ -69,17 +73,28 @@ int runFormat(const TOptions &options) {
     if (options.bCheckOnly) {
       if (!programHoldsBlock(*program.pText, sBlock)) {
         std::fprintf(stderr, "%s: configuration block is not in generated form\n", displayName(sPath).c_str());
+        if (options.bList) std::printf("%s\n", displayName(sPath).c_str());
         fail(kExitRejected);
       }
       continue;
     }
     const std::string sFormatted = replaceConfigurationBlock(*program.pText, sBlock);
+    const bool bChanges = sFormatted != program.pText->bytes();
     if (options.bInPlace) {
       std::string sError;
-      if (sFormatted != program.pText->bytes() && !writeFileAtomically(sPath, sFormatted, sError)) {
+      if (bChanges && !writeFileAtomically(sPath, sFormatted, sError)) {
         std::fprintf(stderr, "robotcfg: %s\n", sError.c_str());
         fail(kExitUsage);
+        continue;
       }
+      if (bChanges && options.bList) std::printf("%s\n", displayName(sPath).c_str());
+      if (bChanges && options.bVerbose) std::fprintf(stderr, "reformatted %s\n", displayName(sPath).c_str());
+    } else if (options.bDiff || options.bList) {
+      // Shows what would change, changes nothing, and fails as --check does.
+      if (!bChanges) continue;
+      if (options.bList) std::printf("%s\n", displayName(sPath).c_str());
+      if (options.bDiff) writeStdout(colouredDiff(unifiedDiff(program.pText->bytes(), sFormatted, displayName(sPath))));
+      fail(kExitRejected);
     } else {
       writeStdout(sFormatted);
     }

@@ -198,7 +198,7 @@ std::string fishCompletion() {
     sOut += " -d '" + sHelp + "'\n";
   }
   // Commands that take files complete file names.
-  sOut += "complete -c robotcfg -n 'not __fish_use_subcommand; and not __fish_seen_subcommand_from models completion' -F\n";
+  sOut += "complete -c robotcfg -n 'not __fish_use_subcommand; and not __fish_seen_subcommand_from models init completion' -F\n";
   return sOut;
 }
 
@@ -232,7 +232,8 @@ std::string usageText(TCommand nCommand) {
   }
   sOut += "\noptions (every command):\n" + optionLines(kEveryCommand) +
           "\n'robotcfg COMMAND --help' describes a command and its options.\n"
-          "FILE '-' reads standard input.\n"
+          "FILE '-' reads standard input. A project file robotcfg.toml (or .robotcfg.toml) in\n"
+          "a program's folder or above it sets the platform, board and files (see 'init').\n"
           "exit status: 0 success, 1 rejected lines (or --check found changes), 2 usage or I/O error.\n";
   return sOut;
 }
@@ -243,7 +244,11 @@ std::string manPage() {
                      ".SH SYNOPSIS\n.B robotcfg\n[\\fIoptions\\fR] \\fIcommand\\fR [\\fIFILE\\fR...]\n"
                      ".SH DESCRIPTION\n" +
                      roff("Reads, checks and rewrites the '#pragma config(...)' block of robot programs. "
-                          "FILE '-' reads standard input.") +
+                          "FILE '-' reads standard input. A project file robotcfg.toml (or .robotcfg.toml) in "
+                          "a program's folder or above it sets the platform, board and files: the keys "
+                          "platform, board, external-controllers, extensions (default [\".c\"]) and exclude "
+                          "(glob patterns relative to the file's folder). The nearest file wins; options "
+                          "on the command line override it.") +
                      "\n.SH COMMANDS\n";
   for (size_t n = 0; n < kNumbOfCommandSpecs; ++n) {
     const TCommandSpec &command = kCommandSpecs[n];
@@ -254,7 +259,7 @@ std::string manPage() {
   }
   sOut += ".SH OPTIONS\n" + manOptions(kEveryCommand) +
           ".SH ENVIRONMENT\n.TP\n.B ROBOTCFG_PLATFORM\n" +
-          roff("the platform when --platform names none") + "\n.SH EXIT STATUS\n" +
+          roff("the platform when neither --platform nor a project file names one") + "\n.SH EXIT STATUS\n" +
           roff("0 success, 1 rejected lines (or a block that would change), 2 usage or I/O error.") + "\n";
   return sOut;
 }

@@ -9,11 +9,23 @@ constexpr unsigned kFormat = commandBit(TCommand::kFormat);
 constexpr unsigned kGenerate = commandBit(TCommand::kGenerate);
 constexpr unsigned kShow = commandBit(TCommand::kShow);
 constexpr unsigned kDiff = commandBit(TCommand::kDiff);
+constexpr unsigned kModels = commandBit(TCommand::kModels);
 constexpr unsigned kSaveModel = commandBit(TCommand::kSaveModel);
 /// Commands that read programs, and so a project file.
-constexpr unsigned kReading = kCheck | kFormat | kGenerate | kShow | kDiff | kSaveModel;
+constexpr unsigned kReading = kCheck | kFormat | kGenerate | kShow | kDiff | kModels | kSaveModel;
 
 using TApply = bool (*)(TOptions &, const std::string &, std::string &);
+
+bool setColor(TOptions &options, const std::string &sValue, std::string &sError) {
+  if (sValue == "auto") options.nColor = TColorWhen::kAuto;
+  else if (sValue == "always") options.nColor = TColorWhen::kAlways;
+  else if (sValue == "never") options.nColor = TColorWhen::kNever;
+  else {
+    sError = "unknown --color value '" + sValue + "' (auto, always or never)";
+    return false;
+  }
+  return true;
+}
 
 bool setReportFormat(TOptions &options, const std::string &sValue, std::string &sError) {
   if (sValue != "text" && sValue != "json" && sValue != "sarif") {
@@ -44,21 +56,22 @@ bool setBoard(TOptions &options, const std::string &sValue, std::string &sError)
 }  // namespace
 
 const TCommandSpec kCommandSpecs[] = {
-    {TCommand::kCheck, "check", "FILE...", 1, -1, "no input files",
+    {TCommand::kCheck, "check", "FILE|FOLDER...", 1, -1, "no input files",
      "report mistakes as FILE:LINE:COL: error: MESSAGE [CODE]",
      "Reads the configuration block of each program and reports every line that is\n"
      "refused or would be lost, with warnings for legal but doubtful settings\n"
-     "(docs/DIAGNOSTICS.md lists the codes). FILE '-' reads standard input.\n",
+     "(docs/DIAGNOSTICS.md lists the codes). A folder is searched for programs\n"
+     "(see the project file); FILE '-' reads standard input.\n",
      "0 no errors, 1 errors found (or warnings with --Werror), 2 usage or I/O error.",
      "robotcfg check --platform vexpic robot.c\nrobotcfg check .    # with a robotcfg.toml"},
-    {TCommand::kFormat, "format", "FILE...", 1, -1, "no input files",
+    {TCommand::kFormat, "format", "FILE|FOLDER...", 1, -1, "no input files",
      "print each program with its configuration block regenerated",
      "Regenerates the configuration block of each program in its settled form and\n"
      "prints the program, or rewrites it with -i. Nothing else in the file changes.\n"
      "A program with a refused line is left alone.\n",
-     "0 done (with --check: nothing would change), 1 refused lines or a block "
+     "0 done (with --check, --diff, -l: nothing would change), 1 refused lines or a block "
      "that would change, 2 usage or I/O error.",
-     "robotcfg format -i robot.c"},
+     "robotcfg format -i robot.c\nrobotcfg format --diff src/"},
     {TCommand::kGenerate, "generate", "FILE", 1, 1, "generate takes exactly one file",
      "print only the regenerated configuration block",
      "Prints the configuration block that format would write, without the rest of\n"
@@ -85,7 +98,13 @@ const TCommandSpec kCommandSpecs[] = {
      "Writes the configuration of FILE, device by device, as a model file that a\n"
      "UserModel line can name.\n",
      "0 saved, 1 refused lines, 2 usage or I/O error.", "robotcfg save-model robot.c -o base.model"},
-        {TCommand::kCompletion, "completion", "bash|zsh|fish", 1, 1, "completion takes one shell: bash, zsh or fish",
+        {TCommand::kInit, "init", "", 0, 0, "init takes no file",
+     "write a commented robotcfg.toml in the current folder",
+     "Writes robotcfg.toml, with the platform, board and controller toggle given\n"
+     "(or the defaults) and every other key commented out. An existing file is\n"
+     "kept.\n",
+     "0 written, 2 the file exists or cannot be written.", "robotcfg init --platform vexi2c"},
+    {TCommand::kCompletion, "completion", "bash|zsh|fish", 1, 1, "completion takes one shell: bash, zsh or fish",
      "print a shell completion script",
      "Prints a completion script for the shell: commands, options, platform names\n"
      "and board keywords.\n",
@@ -97,21 +116,29 @@ const size_t kNumbOfCommandSpecs = sizeof(kCommandSpecs) / sizeof(kCommandSpecs[
 const TOptionSpec kOptionSpecs[] = {
     {nullptr, "--platform", "KIND", kEveryCommand,
      "platform kind: a number 0..14 or a name such as nxt, vexpic, vexi2c, arduino "
-     "(default: $ROBOTCFG_PLATFORM, else nxt)",
+     "(default: the project file's, else $ROBOTCFG_PLATFORM, else nxt)",
      "@platforms", setPlatform},
     {nullptr, "--board", "BOARD", kEveryCommand,
      "controller board chosen in the IDE: a number or a board keyword (default: the platform's own board)",
      "@boards", setBoard},
     {nullptr, "--external-controllers", nullptr, kEveryCommand, "enable \"External Motor/Servo Controllers\"", nullptr,
      [](TOptions &o, const std::string &, std::string &) { return o.bExternalControllers = o.bExternalGiven = true; }},
-            {nullptr, "--stdin-filename", "NAME", kReading,
-     "the name of the program read from '-' in messages (and the folder its user models are found in)", "@files",
+    {nullptr, "--config", "FILE", kReading, "use this project file for every program instead of searching for one",
+     "@files", TEXT(sConfigPath)},
+    {nullptr, "--no-config", nullptr, kReading, "use no project file", nullptr, SWITCH(bNoConfig)},
+    {nullptr, "--stdin-filename", "NAME", kReading,
+     "the name of the program read from '-' in messages; its folder is where its project file and user models are found", "@files",
      TEXT(sStdinFilename)},
     {"-i", "--in-place", nullptr, kFormat, "rewrite the files instead of printing them", nullptr, SWITCH(bInPlace)},
     {nullptr, "--check", nullptr, kFormat, "change nothing; exit 1 when a block is not in generated form", nullptr,
      SWITCH(bCheckOnly)},
-            {"-v", "--verbose", nullptr, kDiff, "list the devices that differ",
-     nullptr, SWITCH(bVerbose)},
+    {nullptr, "--diff", nullptr, kFormat, "print a unified diff of each file that would change; exit 1 when any would",
+     nullptr, SWITCH(bDiff)},
+    {"-l", "--list", nullptr, kFormat,
+     "print the names of the files that would change (exit 1 when any would), or with -i of those rewritten",
+     nullptr, SWITCH(bList)},
+    {"-v", "--verbose", nullptr, kDiff | kFormat,
+     "diff: list the devices that differ; format -i: say which files were rewritten", nullptr, SWITCH(bVerbose)},
     {nullptr, "--format", "text|json|sarif", kCheck, "how findings are reported (json and sarif on standard output)",
      "text json sarif", setReportFormat},
     {nullptr, "--Werror", nullptr, kCheck | kFormat, "treat warnings as errors", nullptr, SWITCH(bWarningsAreErrors)},
@@ -119,7 +146,10 @@ const TOptionSpec kOptionSpecs[] = {
     {nullptr, "--show-source", nullptr, kCheck | kFormat,
      "show the offending line under each finding (default on a terminal)", nullptr, SWITCH(bShowSource)},
     {"-o", "--output", "OUT", kSaveModel, "the model file to write", "@files", TEXT(sOutputPath)},
-        {"-h", "--help", nullptr, kEveryCommand, "show this help (after a command: the command's)", nullptr, SWITCH(bHelp)},
+        {nullptr, "--color", "WHEN", kEveryCommand,
+     "colour the output: auto (on a terminal, unless NO_COLOR is set), always or never", "auto always never",
+     setColor},
+    {"-h", "--help", nullptr, kEveryCommand, "show this help (after a command: the command's)", nullptr, SWITCH(bHelp)},
     {nullptr, "--version", nullptr, kEveryCommand, "show the version", nullptr, SWITCH(bVersion)},
     {nullptr, "--man", nullptr, kEveryCommand, "print the manual page (roff)", nullptr, SWITCH(bManPage)},
 };

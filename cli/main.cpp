@@ -7,7 +7,9 @@
 
 #include "cli/Commands.h"
 #include "cli/Help.h"
+#include "cli/InputFiles.h"
 #include "cli/ReadProgram.h"
+#include "cli/Terminal.h"
 #include "cli/Options.h"
 #include "robotconfig/host/Platform.h"
 #include "robotconfig/program/StandardModelList.h"
@@ -38,7 +40,13 @@ int main(int argc, char **argv) {
     return kExitOk;
   }
   setStdinFilename(options.sStdinFilename);
-  selectHostPlatform(options.nPlatformKind, options.nBoard, options.bExternalControllers);
+  setColorWhen(options.nColor);
+  if (!expandInputFiles(options, sError)) {
+    std::fprintf(stderr, "robotcfg: %s\n", sError.c_str());
+    return kExitUsage;
+  }
+  // check and format select again for each program; the others read one.
+  selectPlatformForProgram(options.files.empty() ? std::string() : options.files.front(), options);
   installHostStandardModelList();
   int nStatus = kExitUsage;
   switch (options.nCommand) {

@@ -95,6 +95,7 @@ TEST(Cli, MissingFilesAndDirectoriesExitWithStatusTwo) {
     EXPECT_EQ(r.sErr, "robotcfg: cannot open '" + sMissing + "': No such file or directory\n");
     EXPECT_EQ(r.sOut, "");
 
+    if (std::string(pzCommand) == "check" || std::string(pzCommand) == "format") continue;  // they walk folders
     r = runRobotcfg({pzCommand, dir.path()});
     EXPECT_EQ(r.nExit, 2);
     EXPECT_EQ(r.sErr, "robotcfg: cannot read '" + dir.path() + "': Is a directory\n");

@@ -1,0 +1,214 @@
+#include "cli/ProjectFile.h"
+
+#include <fnmatch.h>
+
+#include <filesystem>
+#include <fstream>
+#include <map>
+#include <sstream>
+
+#include <toml++/toml.h>
+
+#include "robotconfig/host/Platform.h"
+
+namespace fs = std::filesystem;
+
+const char *const kProjectFileNames[2] = {"robotcfg.toml", ".robotcfg.toml"};
+
+namespace {
+
+// A project file is a few lines; a larger one is a mistake, not a project file.
+constexpr std::uintmax_t kMaxProjectFileSize = 1 << 20;
+
+// "FILE:LINE:COL: " of a place in a project file.
+std::string placeOf(const std::string &sPath, const toml::source_region &region) {
+  return sPath + ":" + std::to_string(region.begin.line) + ":" + std::to_string(region.begin.column) + ": ";
+}
+
+// Reads a list of strings; false when the value is anything else.
+bool readStrings(const toml::node &value, std::vector<std::string> &out) {
+  const toml::array *pArray = value.as_array();
+  if (!pArray) return false;
+  out.clear();
+  for (const toml::node &item : *pArray) {
+    const std::optional<std::string> sItem = item.value<std::string>();
+    if (!sItem) return false;
+    out.push_back(*sItem);
+  }
+  return true;
+}
+
+// A number or a name as text, for the platform and board lookups.
+std::optional<std::string> numberOrName(const toml::node &value) {
+  if (const std::optional<int64_t> nValue = value.value<int64_t>())
+    return *nValue >= 0 ? std::optional<std::string>(std::to_string(*nValue)) : std::optional<std::string>("-1");
+  if (value.is_string()) return value.value<std::string>();
+  return std::nullopt;
+}
+
+// One key of the file: stores its value; false with a message for a bad one.
+using TKeyReader = bool (*)(const toml::node &value, TProjectSettings &settings, std::string &sError);
+
+struct TProjectKey {
+  const char *pzName;
+  TKeyReader read;
+};
+
+const TProjectKey kProjectKeys[] = {
+    {"platform",
+     [](const toml::node &value, TProjectSettings &settings, std::string &sError) {
+       const std::optional<std::string> sText = numberOrName(value);
+       settings.nPlatformKind = sText ? findPlatformKind(*sText) : -1;
+       if (settings.nPlatformKind < 0) sError = unknownPlatformMessage(sText ? *sText : "");
+       return settings.bHasPlatform = settings.nPlatformKind >= 0;
+     }},
+    {"board",
+     [](const toml::node &value, TProjectSettings &settings, std::string &sError) {
+       const std::optional<std::string> sText = numberOrName(value);
+       settings.nBoard = sText ? findBoard(*sText) : -1;
+       if (settings.nBoard < 0) sError = unknownBoardMessage(sText ? *sText : "");
+       return settings.bHasBoard = settings.nBoard >= 0;
+     }},
+    {"external-controllers",
+     [](const toml::node &value, TProjectSettings &settings, std::string &sError) {
+       const std::optional<bool> bValue = value.value<bool>();
+       if (!bValue) sError = "needs true or false";
+       settings.bExternalControllers = bValue.value_or(false);
+       return settings.bHasExternal = bValue.has_value();
+     }},
+    {"extensions",
+     [](const toml::node &value, TProjectSettings &settings, std::string &sError) {
+       if (!readStrings(value, settings.extensions)) sError = "needs a list of strings such as [\".c\"]";
+       return sError.empty();
+     }},
+    {"exclude",
+     [](const toml::node &value, TProjectSettings &settings, std::string &sError) {
+       if (!readStrings(value, settings.exclude)) sError = "needs a list of glob patterns";
+       return sError.empty();
+     }},
+};
+
+std::string keyNames() {
+  std::string sNames;
+  for (const TProjectKey &key : kProjectKeys) sNames += (sNames.empty() ? "" : ", ") + std::string(key.pzName);
+  return sNames;
+}
+
+// The project file in a folder; "" when none.
+std::string projectFileIn(const fs::path &folder) {
+  for (const char *pzName : kProjectFileNames) {
+    std::error_code error;
+    const fs::path candidate = folder / pzName;
+    if (fs::is_regular_file(candidate, error)) return candidate.string();
+  }
+  return "";
+}
+
+// The nearest project file from `folder` upwards; "" when none. Folders
+// already searched are remembered: a tree of programs searches each once.
+std::string nearestProjectFile(fs::path folder) {
+  static std::map<std::string, std::string> found;
+  std::vector<std::string> searched;
+  std::string sFile;
+  for (;;) {
+    const auto known = found.find(folder.string());
+    if (known != found.end()) {
+      sFile = known->second;
+      break;
+    }
+    searched.push_back(folder.string());
+    sFile = projectFileIn(folder);
+    if (!sFile.empty() || folder == folder.parent_path() || folder.empty()) break;
+    folder = folder.parent_path();
+  }
+  for (const std::string &sFolder : searched) found[sFolder] = sFile;
+  return sFile;
+}
+
+}  // namespace
+
+bool loadProjectFile(const std::string &sPath, TProjectSettings &settings, std::string &sError) {
+  settings = TProjectSettings();
+  settings.sPath = sPath;
+  std::error_code error;
+  settings.sFolder = fs::absolute(fs::path(sPath), error).parent_path().string();
+  std::ifstream in(sPath, std::ios::binary);
+  if (!in || fs::is_directory(sPath, error)) {
+    sError = sPath + ": cannot read the project file";
+    return false;
+  }
+  if (fs::file_size(sPath, error) > kMaxProjectFileSize) {
+    sError = sPath + ": the project file is larger than 1 MiB";
+    return false;
+  }
+  std::ostringstream bytes;
+  bytes << in.rdbuf();
+  const std::string sText = bytes.str();
+  toml::table table;
+  try {
+    table = toml::parse(std::string_view(sText), std::string_view(sPath));
+  } catch (const toml::parse_error &failure) {
+    sError = placeOf(sPath, failure.source()) + std::string(failure.description());
+    return false;
+  }
+  for (auto &&[key, value] : table) {
+    const TProjectKey *pKey = nullptr;
+    for (const TProjectKey &candidate : kProjectKeys)
+      if (key.str() == candidate.pzName) pKey = &candidate;
+    if (!pKey) {
+      sError = placeOf(sPath, key.source()) + "unknown key '" + std::string(key.str()) + "' (" + keyNames() + ")";
+      return false;
+    }
+    std::string sMessage;
+    if (!pKey->read(value, settings, sMessage)) {
+      sError = placeOf(sPath, value.source()) + "'" + pKey->pzName + "': " + sMessage;
+      return false;
+    }
+  }
+  return true;
+}
+
+bool projectSettingsFor(const std::string &sPath, bool bIsFolder, const TOptions &options,
+                        TProjectSettings &settings, std::string &sError) {
+  settings = TProjectSettings();
+  if (options.bNoConfig) return true;
+  std::string sFile = options.sConfigPath;
+  if (sFile.empty()) {
+    std::error_code error;
+    const fs::path path = fs::absolute(sPath.empty() ? fs::path(".") : fs::path(sPath), error);
+    sFile = nearestProjectFile(bIsFolder ? path.lexically_normal() : path.lexically_normal().parent_path());
+  }
+  if (sFile.empty()) return true;
+  // A file is read once however many programs it covers.
+  static std::map<std::string, std::pair<TProjectSettings, std::string>> loaded;
+  auto known = loaded.find(sFile);
+  if (known == loaded.end()) {
+    TProjectSettings read;
+    std::string sMessage;
+    if (!loadProjectFile(sFile, read, sMessage)) read.sPath.clear();
+    known = loaded.emplace(sFile, std::make_pair(read, sMessage)).first;
+  }
+  settings = known->second.first;
+  sError = known->second.second;
+  return sError.empty();
+}
+
+void selectPlatformFor(const TProjectSettings &settings, const TOptions &options) {
+  const int nKind = !options.bPlatformGiven && settings.bHasPlatform ? settings.nPlatformKind : options.nPlatformKind;
+  TControllerBoardType nBoard = options.nBoard;
+  if (!options.bBoardGiven) nBoard = settings.bHasBoard ? settings.nBoard : -1;
+  const bool bExternal = options.bExternalGiven || (settings.bHasExternal && settings.bExternalControllers);
+  selectHostPlatform(nKind, nBoard, bExternal);
+}
+
+bool bExcluded(const TProjectSettings &settings, const std::string &sPath) {
+  if (settings.exclude.empty()) return false;
+  std::error_code error;
+  const std::string sRelative =
+      fs::absolute(fs::path(sPath), error).lexically_normal().lexically_relative(settings.sFolder).generic_string();
+  if (sRelative.empty() || sRelative.rfind("..", 0) == 0) return false;
+  // "*" also matches "/", so "build/*" takes the whole folder, as "build/**" does.
+  for (const std::string &sPattern : settings.exclude)
+    if (::fnmatch(sPattern.c_str(), sRelative.c_str(), 0) == 0) return true;
+  return false;
+}
