@@ -143,7 +143,11 @@ bool loadProjectFile(const std::string &sPath, TProjectSettings &settings, std::
   }
   std::ostringstream bytes;
   bytes << in.rdbuf();
-  const std::string sText = bytes.str();
+  return parseProjectText(bytes.str(), sPath, settings, sError);
+}
+
+bool parseProjectText(const std::string &sText, const std::string &sPath, TProjectSettings &settings,
+                      std::string &sError) {
   toml::table table;
   try {
     table = toml::parse(std::string_view(sText), std::string_view(sPath));

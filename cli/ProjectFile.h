@@ -29,6 +29,11 @@ extern const char *const kProjectFileNames[2];
 /// it cannot be read, is no TOML, or holds an unknown key or a bad value.
 bool loadProjectFile(const std::string &sPath, TProjectSettings &settings, std::string &sError);
 
+/// Reads the text of a project file named `sPath` into `settings` (whose
+/// path and folder the caller sets); false with the message as above.
+bool parseProjectText(const std::string &sText, const std::string &sPath, TProjectSettings &settings,
+                      std::string &sError);
+
 /// The project file of a program or folder (`sPath`; "" stands for the
 /// current folder): --config's, none with --no-config, or the nearest one
 /// found upwards. False (with the message) when that file is bad.
