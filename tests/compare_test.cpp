@@ -185,6 +185,7 @@ TEST_F(ConfigurationCompare, WhatCopyingCarriesOver) {
   source.bQuadPortErrorShown = true;
   source.bHubDefaultNamesConfigured = true;
   source.sDefaultSensorNames[1] = L"light";
+  source.pNtwkInfo->setNetworkName(L"net");
 
   // copyFrom: settings, read-time information, user names with their lines, model names.
   CHostRobotConfiguration target;
@@ -217,6 +218,9 @@ TEST_F(ConfigurationCompare, WhatCopyingCarriesOver) {
   EXPECT_EQ(copy.sDefaultSensorNames[1], L"light");
   EXPECT_EQ(copy.getParseInfo().firstConfigLine, TLineNumber(3, 0));
   EXPECT_EQ(std::memcmp(&copy.getSettings(), &source.getSettings(), sizeof(TConfigurationSettings)), 0);
+  EXPECT_NE(copy.pNtwkInfo, source.pNtwkInfo);  // each record owns its network
+  EXPECT_NE(target.pNtwkInfo, source.pNtwkInfo);
+  EXPECT_EQ(target.pNtwkInfo->sNetworkName, L"net");
 }
 
 }  // namespace

@@ -5,7 +5,6 @@
 #include <vector>
 
 #include "robotconfig/program/HostConfiguration.h"
-#include "robotconfig/host/Networking.h"
 #include "robotconfig/host/Platform.h"
 #include "tests/config_lines.h"
 
@@ -140,62 +139,6 @@ TEST_F(ConfigurationRecord, DriveTrainAndGripperMotorCounts) {
   rec.settings.nGripperArmType = 2;
   EXPECT_EQ(rec.getNumbOfMotorsForDriveTrain(), 3);
   EXPECT_EQ(rec.getNumbOfMotorsForGripperArm(), 4);
-}
-
-TEST_F(ConfigurationRecord, CompareReportsTheFirstKindOfDifference) {
-  selectHostPlatform(platformNxt);
-  CHostRobotConfiguration a;
-  CHostRobotConfiguration b;
-  EXPECT_EQ(a == b, 1);
-  b.sServoNames[4] = L"claw";
-  a.sServoNames[4] = L"Claw";  // names are compared with case
-  EXPECT_EQ(a.compareConfiguration(b), configCompareNamesDiffer);
-  EXPECT_EQ(a != b, 1);
-  b.sServoNames[4] = L"Claw";
-  // An empty name does not stand for the default when this record has a default of its own.
-  b.sMotorNames[0] = L"motorA";
-  EXPECT_EQ(a.compareConfiguration(b), configCompareNamesDiffer);
-  EXPECT_EQ(b.compareConfiguration(a), configCompareNamesDiffer);
-  b.sMotorNames[0].Empty();
-  b.sModelNameUserFile = L"robot.txt";
-  EXPECT_EQ(a.compareConfiguration(b), configCompareModelNamesDiffer);
-  // A setting outranks differing names and model names.
-  b.sMotorNames[1] = L"right";
-  b.setMotorReversedInConfig(1, true);
-  EXPECT_EQ(a.compareConfiguration(b), configCompareSettingsDiffer);
-
-  CHostRobotConfiguration c;
-  c.pNtwkInfo->setNetworkName(L"net");
-  EXPECT_EQ(a.compareConfiguration(c), configCompareSettingsDiffer);
-}
-
-TEST_F(ConfigurationRecord, AssignmentAndCopyConstruction) {
-  selectHostPlatform(platformNxt, -1, true);
-  CHostRobotConfiguration source;
-  source.settings.nSensorPortHubs[0][0] = hubHTMotor;
-  source.setMotorTypeInConfig(3, 20);
-  source.sMotorNames[3] = L"arm";
-  source.motorNameLines[3] = TLineNumber(4, 0);
-  source.sBoardDefaultMotorNames[0] = L"sourceDefault";
-  source.sSourceCode = L"source text";
-  source.pNtwkInfo->setNetworkName(L"net");
-
-  CHostRobotConfiguration target;
-  target.sSourceCode = L"target text";
-  target.sBoardDefaultMotorNames[0] = L"targetDefault";
-  static_cast<CRobotConfigurationBasic &>(target) = source;
-  EXPECT_EQ(target.compareConfiguration(source), configCompareSame);
-  EXPECT_EQ(target.motorNameLines[3], TLineNumber(4, 0));
-  EXPECT_EQ(target.pNtwkInfo->sNetworkName, L"net");
-  EXPECT_NE(target.pNtwkInfo, source.pNtwkInfo);
-  EXPECT_EQ(target.sSourceCode, L"target text");
-  EXPECT_EQ(target.sBoardDefaultMotorNames[0], L"targetDefault");
-
-  const CHostRobotConfiguration copy(source);  // takes every member
-  EXPECT_EQ(copy.compareConfiguration(source), configCompareSame);
-  EXPECT_NE(copy.pNtwkInfo, source.pNtwkInfo);
-  EXPECT_EQ(copy.sSourceCode, L"source text");
-  EXPECT_EQ(copy.sBoardDefaultMotorNames[0], L"sourceDefault");
 }
 
 }  // namespace
