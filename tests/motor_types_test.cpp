@@ -177,6 +177,7 @@ TEST_F(MotorRules, HubMotorAndServoNumbering) {
   EXPECT_EQ(rec.getDeviceIndexOnMotorHub(hubHTServo, 0, 1, 1), -1);
   EXPECT_EQ(rec.getMotorMuxForMotor(6), hubHTMotor);
   EXPECT_EQ(rec.getMotorMuxForMotor(7), hubNone);
+  EXPECT_EQ(rec.getMotorMuxForMotor(2), hubNone);  // a built-in port
   // A chain that starts empty holds no motors, though the port holds a controller.
   rec.settings.nSensorPortHubs[0] = {hubNone, hubHTMotor, hubNone, hubNone};
   EXPECT_FALSE(rec.bIsValidMotorPort(3));
