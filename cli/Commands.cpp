@@ -14,9 +14,10 @@ namespace {
 
 // The configuration block the record generates.
 // The settled block of a program's configuration; false (after saying so) when it does not settle.
-bool settledBlock(const std::string &sPath, const TReadProgram &program, CString &sBlock) {
+// `pHeld`, when given, tells whether the program already holds that block.
+bool settledBlock(const std::string &sPath, const TReadProgram &program, CString &sBlock, bool *pHeld = nullptr) {
   std::vector<TConfigurationDiagnostic> refused;
-  if (generateSettledBlock(*program.pConfig, sBlock, &refused, program.pText.get())) return true;
+  if (generateSettledBlock(*program.pConfig, sBlock, &refused, program.pText.get(), pHeld)) return true;
   if (refused.empty()) {
     std::fprintf(stderr, "%s: error: the configuration block does not settle when it is regenerated\n",
                  displayName(sPath).c_str());
@@ -66,20 +67,21 @@ int runFormat(const TOptions &options) {
       continue;
     }
     CString sBlock;
-    if (!settledBlock(sPath, program, sBlock)) {
+    bool bHeld = false;
+    if (!settledBlock(sPath, program, sBlock, &bHeld)) {
       fail(kExitRejected);
       continue;
     }
     if (options.bCheckOnly) {
-      if (!programHoldsBlock(*program.pText, sBlock)) {
+      if (!bHeld) {
         std::fprintf(stderr, "%s: configuration block is not in generated form\n", displayName(sPath).c_str());
         if (options.bList) std::printf("%s\n", displayName(sPath).c_str());
         fail(kExitRejected);
       }
       continue;
     }
-    const std::string sFormatted = replaceConfigurationBlock(*program.pText, sBlock);
-    const bool bChanges = sFormatted != program.pText->bytes();
+    const std::string sFormatted = bHeld ? program.pText->bytes() : replaceConfigurationBlock(*program.pText, sBlock);
+    const bool bChanges = !bHeld;
     if (options.bInPlace) {
       std::string sError;
       if (bChanges && !writeFileAtomically(sPath, sFormatted, sError)) {

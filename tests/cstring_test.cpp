@@ -64,6 +64,11 @@ TEST(CStringFormat, MissingArgumentsAndOddFormats) {
   CString s(L"start:");
   s.AppendFormat(L"%s/%d", L"x", 9);
   EXPECT_EQ(s.str(), L"start:x/9");
+  // Formatting a string into itself reads the text as it was before.
+  s.Format(L"<%s>", s);
+  EXPECT_EQ(s.str(), L"<start:x/9>");
+  s.AppendFormat(L"%s", s);
+  EXPECT_EQ(s.str(), L"<start:x/9><start:x/9>");
 }
 
 TEST(CString, CompareFindReplaceTrim) {

@@ -68,7 +68,7 @@ inline bool startsWith(TLineView text, TLineView prefix) { return text.substr(0,
 
 /// Copies `token` into slot `nIndex` of `parms`.
 inline void storeToken(TTokenizedConfigParms &parms, int nIndex, TLineView token) {
-  parms.sParms[static_cast<size_t>(nIndex)] = CString(std::wstring(token));
+  parms.sParms[static_cast<size_t>(nIndex)].SetString(token.data(), static_cast<int>(token.size()));
 }
 
 }  // namespace

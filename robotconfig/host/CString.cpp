@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <cwchar>
 #include <cwctype>
+#include <functional>
 
 namespace robotconfig_detail {
 
@@ -53,33 +54,38 @@ struct TConversionLayout {
 };
 
 // Appends `body` padded to the layout's width; zero padding goes after a sign.
-void appendPadded(std::wstring &out, const std::wstring &body, const TConversionLayout &layout, bool bNumeric) {
+void appendPadded(std::wstring &out, std::wstring_view body, const TConversionLayout &layout, bool bNumeric) {
   const int nPad = layout.nWidth > static_cast<int>(body.size()) ? layout.nWidth - static_cast<int>(body.size()) : 0;
   if (layout.bLeft) {
     out += body;
     out.append(size_t(nPad), L' ');
   } else if (layout.bZero && bNumeric && layout.nPrecision < 0) {
     size_t nSign = (!body.empty() && (body[0] == L'-' || body[0] == L'+')) ? 1 : 0;
-    out.append(body, 0, nSign);
+    out += body.substr(0, nSign);
     out.append(size_t(nPad), L'0');
-    out.append(body, nSign, std::wstring::npos);
+    out += body.substr(nSign);
   } else {
     out.append(size_t(nPad), L' ');
     out += body;
   }
 }
 
-// Digits of `value` in `base`, at least `nMinDigits` long.
-std::wstring digits(unsigned long long value, unsigned base, bool bUpper, int nMinDigits) {
+// Sets `s` to `sign` (when not 0) and the digits of `value` in `base`, at least `nMinDigits` of them.
+void setDigits(std::wstring &s, wchar_t sign, unsigned long long value, unsigned base, bool bUpper, int nMinDigits) {
   const wchar_t *pzDigits = bUpper ? L"0123456789ABCDEF" : L"0123456789abcdef";
-  std::wstring s;
+  wchar_t buffer[64];
+  wchar_t *pEnd = buffer + 64;
+  wchar_t *p = pEnd;
   while (value != 0) {
-    s.insert(s.begin(), pzDigits[value % base]);
+    *--p = pzDigits[value % base];
     value /= base;
   }
-  const int nMin = nMinDigits < 0 ? 1 : nMinDigits;
-  if (static_cast<int>(s.size()) < nMin) s.insert(0, size_t(nMin) - s.size(), L'0');
-  return s;
+  const size_t nDigits = size_t(pEnd - p);
+  const size_t nMin = nMinDigits < 0 ? 1 : size_t(nMinDigits);
+  s.clear();
+  if (sign) s += sign;
+  if (nDigits < nMin) s.append(nMin - nDigits, L'0');
+  s.append(p, nDigits);
 }
 
 std::wstring stringOf(const TFormatArg &arg) {
@@ -98,16 +104,22 @@ std::wstring stringOf(const TFormatArg &arg) {
   return std::wstring();
 }
 
-}  // namespace
+// The text of a string argument, without copying it.
+std::wstring_view stringViewOf(const TFormatArg &arg) {
+  return arg.pzString ? std::wstring_view(arg.pzString, arg.nStringLength) : std::wstring_view(L"(null)");
+}
 
-std::wstring formatWide(const wchar_t *pzFormat, const TFormatArg *pArgs, size_t nArgs) {
-  std::wstring out;
-  if (!pzFormat) return out;
+// Appends `pzFormat` formatted with the arguments, none of which points into `out`.
+void appendConversions(std::wstring &out, const wchar_t *pzFormat, const TFormatArg *pArgs, size_t nArgs) {
+  if (!pzFormat) return;
+  std::wstring body;  // a number's text, reused by every conversion
   size_t nNext = 0;
   const wchar_t *p = pzFormat;
   while (*p) {
     if (*p != L'%') {
-      out += *p++;
+      const wchar_t *pText = p;
+      while (*p && *p != L'%') ++p;
+      out.append(pText, size_t(p - pText));
       continue;
     }
     const wchar_t *pStart = p++;
@@ -148,9 +160,15 @@ std::wstring formatWide(const wchar_t *pzFormat, const TFormatArg *pArgs, size_t
     switch (conv) {
       case L's':
       case L'S': {
-        std::wstring body = stringOf(arg);
-        if (layout.nPrecision >= 0 && static_cast<int>(body.size()) > layout.nPrecision) body.resize(size_t(layout.nPrecision));
-        appendPadded(out, body, layout, false);
+        if (arg.nKind != TFormatArg::Kind::kString) {
+          body = stringOf(arg);
+          if (layout.nPrecision >= 0 && static_cast<int>(body.size()) > layout.nPrecision) body.resize(size_t(layout.nPrecision));
+          appendPadded(out, body, layout, false);
+          break;
+        }
+        std::wstring_view text = stringViewOf(arg);
+        if (layout.nPrecision >= 0 && static_cast<int>(text.size()) > layout.nPrecision) text = text.substr(0, size_t(layout.nPrecision));
+        appendPadded(out, text, layout, false);
         break;
       }
       case L'c':
@@ -159,20 +177,18 @@ std::wstring formatWide(const wchar_t *pzFormat, const TFormatArg *pArgs, size_t
                     : arg.nKind == TFormatArg::Kind::kUnsigned ? static_cast<wchar_t>(arg.nUnsigned)
                                                                : static_cast<wchar_t>(arg.nSigned);
         if (arg.nKind == TFormatArg::Kind::kString) c = (arg.pzString && *arg.pzString) ? *arg.pzString : L'\0';
-        appendPadded(out, std::wstring(1, c), layout, false);
+        appendPadded(out, std::wstring_view(&c, 1), layout, false);
         break;
       }
       case L'd':
       case L'i': {
         if (arg.nKind == TFormatArg::Kind::kString) {
-          appendPadded(out, stringOf(arg), layout, false);
+          appendPadded(out, stringViewOf(arg), layout, false);
           break;
         }
         const long long v = arg.nKind == TFormatArg::Kind::kUnsigned ? static_cast<long long>(arg.nUnsigned) : arg.nSigned;
         const unsigned long long mag = v < 0 ? 0ULL - static_cast<unsigned long long>(v) : static_cast<unsigned long long>(v);
-        std::wstring body = digits(mag, 10, false, layout.nPrecision);
-        if (v < 0) body.insert(body.begin(), L'-');
-        else if (layout.bPlus) body.insert(body.begin(), L'+');
+        setDigits(body, v < 0 ? L'-' : layout.bPlus ? L'+' : L'\0', mag, 10, false, layout.nPrecision);
         appendPadded(out, body, layout, true);
         break;
       }
@@ -180,14 +196,15 @@ std::wstring formatWide(const wchar_t *pzFormat, const TFormatArg *pArgs, size_t
       case L'x':
       case L'X': {
         if (arg.nKind == TFormatArg::Kind::kString) {
-          appendPadded(out, stringOf(arg), layout, false);
+          appendPadded(out, stringViewOf(arg), layout, false);
           break;
         }
         // Like C, a negative int printed unsigned shows its 32-bit pattern.
         unsigned long long v = arg.nUnsigned;
         if (arg.nKind != TFormatArg::Kind::kUnsigned && arg.nSigned < 0 && arg.nSigned >= INT32_MIN)
           v = static_cast<uint32_t>(static_cast<int32_t>(arg.nSigned));
-        appendPadded(out, digits(v, conv == L'u' ? 10 : 16, conv == L'X', layout.nPrecision), layout, true);
+        setDigits(body, L'\0', v, conv == L'u' ? 10 : 16, conv == L'X', layout.nPrecision);
+        appendPadded(out, body, layout, true);
         break;
       }
       default:
@@ -195,7 +212,34 @@ std::wstring formatWide(const wchar_t *pzFormat, const TFormatArg *pArgs, size_t
         break;
     }
   }
+}
+
+}  // namespace
+
+std::wstring formatWide(const wchar_t *pzFormat, const TFormatArg *pArgs, size_t nArgs) {
+  std::wstring out;
+  appendConversions(out, pzFormat, pArgs, nArgs);
   return out;
+}
+
+void formatInto(std::wstring &out, bool bAppend, const wchar_t *pzFormat, const TFormatArg *pArgs, size_t nArgs) {
+  // An argument may be `out` itself (or the format may be), which must not change while it is read.
+  const wchar_t *pFirst = out.data();
+  const wchar_t *pLast = pFirst + out.capacity();
+  auto inside = [pFirst, pLast](const wchar_t *p) {
+    return p && !std::less<const wchar_t *>()(p, pFirst) && !std::less<const wchar_t *>()(pLast, p);
+  };
+  bool bAliased = inside(pzFormat);
+  for (size_t i = 0; i < nArgs; ++i)
+    if (pArgs[i].nKind == TFormatArg::Kind::kString && inside(pArgs[i].pzString)) bAliased = true;
+  if (bAliased) {
+    std::wstring sText = formatWide(pzFormat, pArgs, nArgs);
+    if (bAppend) out += sText;
+    else out = std::move(sText);
+    return;
+  }
+  if (!bAppend) out.clear();
+  appendConversions(out, pzFormat, pArgs, nArgs);
 }
 
 }  // namespace robotconfig_detail
@@ -282,48 +326,75 @@ CString CString::Mid(int nFirst, int nCount) const {
   return CString(m_s.substr(size_t(nFirst), size_t(nCount)));
 }
 
+void CString::appendUtf8(std::string &out, wchar_t wc) {
+  const uint32_t c = static_cast<uint32_t>(wc);
+  if (c < 0x80) {
+    out += static_cast<char>(c);
+  } else if (c >= 0xDC80 && c <= 0xDCFF) {
+    out += static_cast<char>(c - 0xDC00);  // a byte kept from undecodable input
+  } else if (c < 0x800) {
+    out += static_cast<char>(0xC0 | (c >> 6));
+    out += static_cast<char>(0x80 | (c & 0x3F));
+  } else if (c < 0x10000) {
+    out += static_cast<char>(0xE0 | (c >> 12));
+    out += static_cast<char>(0x80 | ((c >> 6) & 0x3F));
+    out += static_cast<char>(0x80 | (c & 0x3F));
+  } else if (c < 0x110000) {
+    out += static_cast<char>(0xF0 | (c >> 18));
+    out += static_cast<char>(0x80 | ((c >> 12) & 0x3F));
+    out += static_cast<char>(0x80 | ((c >> 6) & 0x3F));
+    out += static_cast<char>(0x80 | (c & 0x3F));
+  } else {
+    out += "\xEF\xBF\xBD";  // not a Unicode scalar: replacement character
+  }
+}
+
 std::string CString::toUtf8() const {
   std::string out;
   out.reserve(m_s.size());
-  for (wchar_t wc : m_s) {
-    const uint32_t c = static_cast<uint32_t>(wc);
-    if (c >= 0xDC80 && c <= 0xDCFF) {
-      out += static_cast<char>(c - 0xDC00);  // a byte kept from undecodable input
-    } else if (c < 0x80) {
-      out += static_cast<char>(c);
-    } else if (c < 0x800) {
-      out += static_cast<char>(0xC0 | (c >> 6));
-      out += static_cast<char>(0x80 | (c & 0x3F));
-    } else if (c < 0x10000) {
-      out += static_cast<char>(0xE0 | (c >> 12));
-      out += static_cast<char>(0x80 | ((c >> 6) & 0x3F));
-      out += static_cast<char>(0x80 | (c & 0x3F));
-    } else if (c < 0x110000) {
-      out += static_cast<char>(0xF0 | (c >> 18));
-      out += static_cast<char>(0x80 | ((c >> 12) & 0x3F));
-      out += static_cast<char>(0x80 | ((c >> 6) & 0x3F));
-      out += static_cast<char>(0x80 | (c & 0x3F));
-    } else {
-      out += "\xEF\xBF\xBD";  // not a Unicode scalar: replacement character
+  const size_t n = m_s.size();
+  for (size_t i = 0; i < n;) {
+    if (static_cast<uint32_t>(m_s[i]) < 0x80) {  // an ASCII run is copied a byte per character
+      size_t j = i + 1;
+      while (j < n && static_cast<uint32_t>(m_s[j]) < 0x80) ++j;
+      const size_t nAt = out.size();
+      out.resize(nAt + (j - i));
+      char *pOut = &out[nAt];
+      for (; i < j; ++i) *pOut++ = static_cast<char>(m_s[i]);
+      continue;
     }
+    appendUtf8(out, m_s[i++]);
   }
   return out;
 }
 
 CString CString::fromUtf8(std::string_view bytes) {
-  std::wstring out;
+  CString s;
+  decodeUtf8(bytes, s);
+  return s;
+}
+
+void CString::decodeUtf8(std::string_view bytes, CString &sOut) {
+  std::wstring &out = sOut.m_s;
+  out.clear();
   out.reserve(bytes.size());
   const size_t n = bytes.size();
   size_t i = 0;
   while (i < n) {
     const unsigned char b0 = static_cast<unsigned char>(bytes[i]);
+    if (b0 < 0x80) {  // ASCII, nearly every byte of a program: copied a run at a time
+      size_t j = i + 1;
+      while (j < n && static_cast<unsigned char>(bytes[j]) < 0x80) ++j;
+      const size_t nAt = out.size();
+      out.resize(nAt + (j - i));
+      wchar_t *pOut = &out[nAt];
+      for (; i < j; ++i) *pOut++ = static_cast<wchar_t>(static_cast<unsigned char>(bytes[i]));
+      continue;
+    }
     int nTrail = -1;
     uint32_t c = 0;
     uint32_t nMin = 0;
-    if (b0 < 0x80) {
-      nTrail = 0;
-      c = b0;
-    } else if (b0 >= 0xC2 && b0 <= 0xDF) {
+    if (b0 >= 0xC2 && b0 <= 0xDF) {
       nTrail = 1;
       c = b0 & 0x1F;
       nMin = 0x80;
@@ -357,5 +428,4 @@ CString CString::fromUtf8(std::string_view bytes) {
       ++i;
     }
   }
-  return CString(std::move(out));
 }

@@ -55,6 +55,9 @@ TFormatArg makeFormatArg(T value) {
 // Formats `pzFormat` with the captured arguments; a conversion without an
 // argument produces nothing.
 std::wstring formatWide(const wchar_t *pzFormat, const TFormatArg *pArgs, size_t nArgs);
+// formatWide into `out`, replacing its text or appending to it; the format and
+// the arguments may point into `out`.
+void formatInto(std::wstring &out, bool bAppend, const wchar_t *pzFormat, const TFormatArg *pArgs, size_t nArgs);
 
 }  // namespace robotconfig_detail
 
@@ -81,6 +84,8 @@ class CString {
   }
 
   const wchar_t *GetString() const { return m_s.c_str(); }
+  /// Replaces the text with `nLength` characters at `pz`, reusing the storage.
+  void SetString(const wchar_t *pz, int nLength) { m_s.assign(pz, nLength < 0 ? 0 : size_t(nLength)); }
   const std::wstring &str() const { return m_s; }
 
   /// Case-sensitive three-way comparison (<0, 0, >0).
@@ -115,12 +120,12 @@ class CString {
   template <class... Args>
   void Format(const wchar_t *pzFormat, const Args &...args) {
     robotconfig_detail::TFormatArg list[sizeof...(Args) + 1] = {robotconfig_detail::makeFormatArg(args)...};
-    m_s = robotconfig_detail::formatWide(pzFormat, list, sizeof...(Args));
+    robotconfig_detail::formatInto(m_s, false, pzFormat, list, sizeof...(Args));
   }
   template <class... Args>
   void AppendFormat(const wchar_t *pzFormat, const Args &...args) {
     robotconfig_detail::TFormatArg list[sizeof...(Args) + 1] = {robotconfig_detail::makeFormatArg(args)...};
-    m_s += robotconfig_detail::formatWide(pzFormat, list, sizeof...(Args));
+    robotconfig_detail::formatInto(m_s, true, pzFormat, list, sizeof...(Args));
   }
 
   /// UTF-8 encoding; characters that stood for undecodable bytes turn back
@@ -129,6 +134,10 @@ class CString {
   /// Decodes UTF-8; each byte that is not valid UTF-8 is kept as a stand-in
   /// character (U+DC80..U+DCFF) so that toUtf8() restores it exactly.
   static CString fromUtf8(std::string_view bytes);
+  /// fromUtf8 into `sOut`, reusing its storage.
+  static void decodeUtf8(std::string_view bytes, CString &sOut);
+  /// Appends the UTF-8 encoding of one character as toUtf8() writes it.
+  static void appendUtf8(std::string &out, wchar_t wc);
 
  private:
   std::wstring m_s;

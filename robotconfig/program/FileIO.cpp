@@ -18,15 +18,15 @@ std::string errorText(const std::string &sWhat, const std::string &sPath) {
 
 // Reads everything from an open descriptor.
 bool readAll(int fd, std::string &sBytes) {
-  std::vector<char> buffer(1 << 16);
+  char buffer[1 << 14];  // not cleared: only what read() fills is used
   for (;;) {
-    const ssize_t n = ::read(fd, buffer.data(), buffer.size());
+    const ssize_t n = ::read(fd, buffer, sizeof buffer);
     if (n == 0) return true;
     if (n < 0) {
       if (errno == EINTR) continue;
       return false;
     }
-    sBytes.append(buffer.data(), size_t(n));
+    sBytes.append(buffer, size_t(n));
   }
 }
 

@@ -50,8 +50,7 @@ bool mayBeConfigLine(std::string_view line) {
 
 // The role of one line: configuration lines and the marker lines that close a
 // block are part of it; so are blank lines inside it.
-TLineRole lineRole(const CString &sLine) {
-  TTokenizedConfigParms parms;
+TLineRole lineRole(const CString &sLine, TTokenizedConfigParms &parms) {
   switch (CRobotConfigurationBasic::nTokenizeLine(sLine, parms)) {
     case lineTypeBlank:
       return TLineRole::kBlank;
@@ -73,11 +72,12 @@ TLineRole lineRole(const CString &sLine) {
 // The role of line `nIndex`, decoding it only when its bytes could make it
 // more than an ordinary line: blank lines hold only blanks, and every other
 // role needs "#pragma" first or the marker somewhere.
-TLineRole lineRole(const CProgramText &program, size_t nIndex) {
+TLineRole lineRole(const CProgramText &program, size_t nIndex, CString &sLine, TTokenizedConfigParms &parms) {
   const std::string_view line = program.lineText(nIndex);
   if (line.find_first_not_of(" \t") == std::string_view::npos) return TLineRole::kBlank;
   if (!mayBeConfigLine(line) && line.find("//*!!") == std::string_view::npos) return TLineRole::kOther;
-  return lineRole(program.lineString(nIndex));
+  program.decodeLine(nIndex, sLine);
+  return lineRole(sLine, parms);
 }
 
 // Which lines the block takes and where it starts.
@@ -91,7 +91,9 @@ struct TBlockPlan {
 TBlockPlan planBlock(const CProgramText &program) {
   const size_t nLines = program.lines().size();
   std::vector<TLineRole> roles(nLines);
-  for (size_t i = 0; i < nLines; ++i) roles[i] = lineRole(program, i);
+  CString sLine;
+  TTokenizedConfigParms parms;
+  for (size_t i = 0; i < nLines; ++i) roles[i] = lineRole(program, i, sLine, parms);
 
   std::vector<bool> bRemove(nLines, false);
   size_t nBlockStart = nLines;
@@ -140,11 +142,11 @@ std::vector<TConfigurationDiagnostic> readProgramConfiguration(CRobotConfigurati
   CString sPath;
   config.getPathName(sPath);
   TTokenizedConfigParms parms;
-  CString sError;
+  CString sError, sLine;
   for (size_t i = 0; i < program.lines().size(); ++i) {
     if (!mayBeConfigLine(program.lineText(i))) continue;
     bool bCut = false;
-    const CString sLine = program.lineString(i);
+    program.decodeLine(i, sLine);
     if (CRobotConfigurationBasic::nTokenizeLineReportingCuts(sLine, parms, bCut) != lineTypeConfigPragma) continue;
     const int nLine = static_cast<int>(i) + 1;
     sError.Empty();
@@ -173,10 +175,15 @@ std::vector<TConfigurationDiagnostic> readProgramConfiguration(CRobotConfigurati
 }
 
 bool generateSettledBlock(CHostRobotConfiguration &config, CString &sBlock,
-                          std::vector<TConfigurationDiagnostic> *pRefused, const CProgramText *pProgram) {
+                          std::vector<TConfigurationDiagnostic> *pRefused, const CProgramText *pProgram,
+                          bool *pHeld) {
+  if (pHeld) *pHeld = false;
   config.buildSourceCodeForConfiguration(sBlock, false);
   // The program's own lines read back into this very record, so its block is settled.
-  if (pProgram && programHoldsBlock(*pProgram, sBlock)) return true;
+  if (pProgram && programHoldsBlock(*pProgram, sBlock)) {
+    if (pHeld) *pHeld = true;
+    return true;
+  }
   CString sPath;
   config.getPathName(sPath);
   // Two rounds settle every case the rules allow; more would mean a fault.
@@ -194,22 +201,41 @@ bool generateSettledBlock(CHostRobotConfiguration &config, CString &sBlock,
     }
     CString sAgain;
     reread.buildSourceCodeForConfiguration(sAgain, false);
-    if (sAgain == sBlock) return true;
+    if (sAgain == sBlock) {
+      if (pHeld && pProgram) *pHeld = programHoldsBlock(*pProgram, sBlock);
+      return true;
+    }
     sBlock = sAgain;
   }
   return false;
 }
 
 std::string encodeGeneratedBlock(const CString &sGenerated, const char *pzLineEnding) {
-  CString sText(sGenerated);
-  sText.Replace(L"\r\n", L"\n");
-  std::string sBytes = sText.toUtf8();
-  if (std::string_view(pzLineEnding) == "\n") return sBytes;
+  const std::wstring &sText = sGenerated.str();
+  const std::string_view ending(pzLineEnding);
+  const size_t n = sText.size();
   std::string sOut;
-  sOut.reserve(sBytes.size() + sBytes.size() / 32);
-  for (char c : sBytes) {
-    if (c == '\n') sOut += pzLineEnding;
-    else sOut += c;
+  sOut.reserve(n + n / 32);
+  // "\r\n" and a lone "\n" both end a line; pairs do not overlap, so "\r\r\n" keeps its first "\r".
+  for (size_t i = 0; i < n;) {
+    const wchar_t c = sText[i];
+    if (c == L'\r' && i + 1 < n && sText[i + 1] == L'\n') {
+      sOut += ending;
+      i += 2;
+    } else if (c == L'\n') {
+      sOut += ending;
+      ++i;
+    } else if (static_cast<uint32_t>(c) < 0x80) {  // an ASCII run up to the next line end, a byte per character
+      size_t j = i + 1;
+      while (j < n && static_cast<uint32_t>(sText[j]) < 0x80 && sText[j] != L'\r' && sText[j] != L'\n') ++j;
+      const size_t nAt = sOut.size();
+      sOut.resize(nAt + (j - i));
+      char *pOut = &sOut[nAt];
+      for (; i < j; ++i) *pOut++ = static_cast<char>(sText[i]);
+    } else {
+      CString::appendUtf8(sOut, c);
+      ++i;
+    }
   }
   return sOut;
 }

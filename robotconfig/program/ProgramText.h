@@ -34,6 +34,10 @@ class CProgramText {
   CString lineString(size_t nIndex) const {
     return CString::fromUtf8(lineText(nIndex).substr(0, kMaxDecodedLineBytes));
   }
+  /// lineString into `sLine`, reusing its storage.
+  void decodeLine(size_t nIndex, CString &sLine) const {
+    CString::decodeUtf8(lineText(nIndex).substr(0, kMaxDecodedLineBytes), sLine);
+  }
   /// The line end the program uses: that of its first line, "\n" by default.
   const char *lineEnding() const { return m_bCrLf ? "\r\n" : "\n"; }
   /// The byte-order mark the text starts with ("" when none); it belongs to no line.
@@ -96,10 +100,12 @@ class CHostRobotConfiguration;
 /// `pRefused`, when given, the lines of it that did not read back.
 /// `pProgram`, when given, is the program `config` was read from (starting
 /// from the same board): when it already holds the first block, that block
-/// is settled without reading it back.
+/// is settled without reading it back. `pHeld`, when given with `pProgram`,
+/// tells whether the program already holds the settled block (replacing its
+/// block would change no byte).
 bool generateSettledBlock(CHostRobotConfiguration &config, CString &sBlock,
                           std::vector<TConfigurationDiagnostic> *pRefused = nullptr,
-                          const CProgramText *pProgram = nullptr);
+                          const CProgramText *pProgram = nullptr, bool *pHeld = nullptr);
 
 /// `sGenerated` with "\r\n" line ends turned into the program's line ending.
 std::string encodeGeneratedBlock(const CString &sGenerated, const char *pzLineEnding);
