@@ -64,6 +64,8 @@ class CCheckContext {
   std::map<std::wstring, TNamedDevice> names;
   /// Sensor types of every port just before the current line.
   std::vector<TSensorTypes> sensorTypesBefore;
+  /// Reading left the IDE's board as it found it, so the block reads back from the same start.
+  bool bBoardKept = false;
 };
 
 /// UTF-8 of a wide text.

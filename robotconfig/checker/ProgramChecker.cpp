@@ -87,7 +87,9 @@ TCheckResult checkProgram(CHostRobotConfiguration &config, const CProgramText &p
   TCheckResult result;
   {
     CCapturingMessageSink capture;
+    const TControllerBoardType nBoardBefore = pToggles->getIDECircuitBoardType();
     result.refused = readProgramConfiguration(config, program, &observer);
+    context.bBoardKept = pToggles->getIDECircuitBoardType() == nBoardBefore;
     messages = std::move(capture.messages);
   }
   for (const TConfigurationDiagnostic &refusal : result.refused) {

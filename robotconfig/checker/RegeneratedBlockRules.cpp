@@ -66,7 +66,10 @@ void checkRegeneratedBlock(CCheckContext &context) {
   CHostRobotConfiguration copy(context.config);
   CString sBlock;
   std::vector<TConfigurationDiagnostic> refused;
-  if (!generateSettledBlock(copy, sBlock, &refused)) {
+  // A program that holds the block its record generates reads back into that
+  // very record (the rules above only look at it): no reading again is needed.
+  bool bHeld = false;
+  if (!generateSettledBlock(copy, sBlock, &refused, context.bBoardKept ? &context.program : nullptr, &bHeld)) {
     // Say which line of the program the unwritable device comes from.
     const CProgramText block(sBlock.toUtf8());
     TTokenizedConfigParms parms;
@@ -99,10 +102,11 @@ void checkRegeneratedBlock(CCheckContext &context) {
 
   // The settled block, read back, indexes its lines by keyword and device.
   CHostRobotConfiguration reread;
-  {
+  if (!bHeld) {
     CCapturingMessageSink quiet;
     readProgramConfiguration(reread, CProgramText(sBlock.toUtf8()));
   }
+  const CRobotConfigurationBasic &readBack = bHeld ? static_cast<const CRobotConfigurationBasic &>(context.config) : reread;
   std::multimap<std::pair<TConfigTypes, std::wstring>, TGeneratedLine> generated;
   const CProgramText block(sBlock.toUtf8());
   for (size_t i = 0; i < block.lines().size(); ++i) {
@@ -110,7 +114,7 @@ void checkRegeneratedBlock(CCheckContext &context) {
     line.sText = block.lineString(i);
     if (CRobotConfigurationBasic::nTokenizeLine(line.sText, line.parms) != lineTypeConfigPragma) continue;
     const TConfigTypes nType = TConfigTypeDefns::lookupConfigType(line.parms.sParms[0]);
-    generated.emplace(std::make_pair(nType, lineKey(reread, nType, line.parms)), line);
+    generated.emplace(std::make_pair(nType, lineKey(readBack, nType, line.parms)), line);
   }
 
   for (TCheckedLine &line : context.lines) {
