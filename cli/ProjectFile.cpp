@@ -2,12 +2,21 @@
 
 #include <fnmatch.h>
 
+#include <algorithm>
 #include <filesystem>
 #include <fstream>
 #include <map>
 #include <sstream>
 
+// toml++ checks a few facts about its input with assertions that abort (in a
+// build without NDEBUG) or that clang assumes true (with NDEBUG), although a
+// malformed file breaks them, e.g. a table header "[&x]". Without the checks
+// its parser reports those inputs as errors, as a gcc release build does.
+#pragma push_macro("NDEBUG")
+#undef NDEBUG
+#define TOML_ASSERT(expr) static_assert(true)
 #include <toml++/toml.h>
+#pragma pop_macro("NDEBUG")
 
 #include "robotconfig/host/Platform.h"
 
@@ -88,6 +97,54 @@ const TProjectKey kProjectKeys[] = {
      }},
 };
 
+// Makes the text pure ASCII for toml++ 3.3, which meets some other
+// characters with undefined behaviour (its whitespace test reaches an
+// unreachable branch, also while it reports an error): blanks out the
+// non-ASCII bytes of comments, and returns the offset of the first one
+// elsewhere (npos when none), which a "..." string can write as \uXXXX.
+size_t makeAsciiForParser(std::string &sText) {
+  enum { kCode, kComment, kBasic, kLiteral, kMultiBasic, kMultiLiteral } nState = kCode;
+  for (size_t n = 0; n < sText.size(); ++n) {
+    const char c = sText[n];
+    if (static_cast<unsigned char>(c) >= 0x80) {
+      if (nState != kComment) return n;
+      sText[n] = ' ';
+      continue;
+    }
+    const bool bTriple = sText.compare(n, 3, std::string(3, c)) == 0;
+    switch (nState) {
+      case kCode:
+        if (c == '#') nState = kComment;
+        else if (c == '"') nState = bTriple ? (n += 2, kMultiBasic) : kBasic;
+        else if (c == '\'') nState = bTriple ? (n += 2, kMultiLiteral) : kLiteral;
+        break;
+      case kComment:
+        if (c == '\n') nState = kCode;
+        break;
+      case kBasic:
+      case kMultiBasic:
+        if (c == '\\') ++n;  // an escape: the next character is the string's
+        else if (c == '"' && (nState == kBasic || bTriple)) nState = nState == kBasic ? kCode : (n += 2, kCode);
+        else if (c == '\n' && nState == kBasic) nState = kCode;  // an unclosed string: toml++ reports it
+        break;
+      case kLiteral:
+      case kMultiLiteral:
+        if (c == '\'' && (nState == kLiteral || bTriple)) nState = nState == kLiteral ? kCode : (n += 2, kCode);
+        else if (c == '\n' && nState == kLiteral) nState = kCode;
+        break;
+    }
+  }
+  return std::string::npos;
+}
+
+// "LINE:COL" of a byte offset, columns counted in bytes.
+std::string lineAndColumn(const std::string &sText, size_t nOffset) {
+  const size_t nLineStart = sText.rfind('\n', nOffset == 0 ? 0 : nOffset - 1);
+  const size_t nLine = size_t(std::count(sText.begin(), sText.begin() + long(nOffset), '\n')) + 1;
+  const size_t nColumn = nLineStart == std::string::npos || nOffset == 0 ? nOffset + 1 : nOffset - nLineStart;
+  return std::to_string(nLine) + ":" + std::to_string(nColumn);
+}
+
 std::string keyNames() {
   std::string sNames;
   for (const TProjectKey &key : kProjectKeys) sNames += (sNames.empty() ? "" : ", ") + std::string(key.pzName);
@@ -148,9 +205,16 @@ bool loadProjectFile(const std::string &sPath, TProjectSettings &settings, std::
 
 bool parseProjectText(const std::string &sText, const std::string &sPath, TProjectSettings &settings,
                       std::string &sError) {
+  std::string sAscii = sText;
+  const size_t nStray = makeAsciiForParser(sAscii);
+  if (nStray != std::string::npos) {
+    sError = sPath + ":" + lineAndColumn(sText, nStray) +
+             ": a character other than ASCII outside a comment (in a \"...\" string write it as \\uXXXX)";
+    return false;
+  }
   toml::table table;
   try {
-    table = toml::parse(std::string_view(sText), std::string_view(sPath));
+    table = toml::parse(std::string_view(sAscii), std::string_view(sPath));
   } catch (const toml::parse_error &failure) {
     sError = placeOf(sPath, failure.source()) + std::string(failure.description());
     return false;
