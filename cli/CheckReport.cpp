@@ -63,12 +63,16 @@ void printFindingsText(const TFileFindings &findings, const TOptions &options) {
 
 int runCheckCommand(const TOptions &options) {
   int nStatus = kExitOk;
-  std::vector<TReadProgram> programs(options.files.size());
+  // Only a JSON or SARIF document needs every file's text and findings at the end;
+  // text reports are printed file by file, so memory stays flat over any number of files.
+  const bool bDocument = options.sReportFormat != "text";
+  std::vector<TReadProgram> programs(bDocument ? options.files.size() : 0);
   std::vector<TFileFindings> reports;
   for (size_t i = 0; i < options.files.size(); ++i) {
     TFileFindings findings;
+    TReadProgram single;
     selectPlatformForProgram(options.files[i], options);
-    if (!readAndCheckProgram(options.files[i], options, programs[i], findings)) {
+    if (!readAndCheckProgram(options.files[i], options, bDocument ? programs[i] : single, findings)) {
       nStatus = kExitUsage;
       continue;
     }
@@ -80,7 +84,7 @@ int runCheckCommand(const TOptions &options) {
         if (finding.nSeverity == TSeverity::kError) kept.push_back(std::move(finding));
       findings.findings = std::move(kept);
     }
-    reports.push_back(std::move(findings));
+    if (bDocument) reports.push_back(std::move(findings));
   }
   std::string sDocument;
   if (options.sReportFormat == "json") sDocument = renderJson(reports);
