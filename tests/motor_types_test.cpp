@@ -219,9 +219,6 @@ TEST_F(MotorRules, MotorIOPinsClaimSensorPorts) {
   rec.setMotorIOPinsInConfigNone(2);
   EXPECT_EQ(rec.getSensorTypeInConfig(8) + rec.getSensorTypeInConfig(4), 0);
   EXPECT_EQ(rec.getMapMotorToPrimaryIOPin(2) + rec.getMapMotorToSecondaryIOPin(2), -2);
-  rec.setMotorIOPinsInConfig(3, 9, 10, true);
-  EXPECT_EQ(rec.getSensorTypeInConfig(9), 59);
-  EXPECT_EQ(rec.getSensorTypeInConfig(10), 59);
 }
 
 TEST_F(MotorRules, DefaultMotorNames) {
