@@ -247,13 +247,14 @@ void formatInto(std::wstring &out, bool bAppend, const wchar_t *pzFormat, const 
 int CString::Compare(const wchar_t *pz) const { return m_s.compare(pz ? pz : L""); }
 
 int CString::CompareNoCase(const wchar_t *pz) const {
-  const wchar_t *a = m_s.c_str();
+  // The whole string counts: a NUL inside it must not end the comparison early.
   const wchar_t *b = pz ? pz : L"";
-  for (;; ++a, ++b) {
-    const wint_t ca = std::towlower(static_cast<wint_t>(*a));
+  for (size_t i = 0;; ++i, ++b) {
+    if (i == m_s.size()) return *b == 0 ? 0 : -1;
+    if (*b == 0) return 1;
+    const wint_t ca = std::towlower(static_cast<wint_t>(m_s[i]));
     const wint_t cb = std::towlower(static_cast<wint_t>(*b));
     if (ca != cb) return ca < cb ? -1 : 1;
-    if (ca == 0) return 0;
   }
 }
 

@@ -21,7 +21,7 @@ uint32_t currentPlatformMask() { return pToggles ? pToggles->getPlatformMask() :
 /// True when the row is on the current platform and spells `sText`.
 bool bRowSpells(const TDeviceTypeMenuItem &row, uint32_t nPlatformMask, const CString &sText) {
   return (row.nPlatformMask & nPlatformMask) != 0 && row.pzKeyword != nullptr &&
-         std::wcscmp(row.pzKeyword, sText.GetString()) == 0;
+         sText == row.pzKeyword;  // the whole word: a NUL inside it is no end
 }
 
 /// Value of the first row on the platform that spells `sText` and passes
