@@ -46,8 +46,8 @@ TEST_F(HostCatalog, PlatformRecordsPerKind) {
       {L"none", 0, 0, 0, 0, false},       {L"nxt", 35, 4, 96, 1, false},      {L"vexpic", 8, 16, 0, 2, false},
       {L"vexi2c", 10, 28, 0, 5, true},    {L"arduino", 12, 70, 0, 8, false},  {L"sensorlab", 0, 8, 0, 7, false},
       {L"datalogger", 0, 4, 0, 7, false}, {L"sharedports", 12, 12, 0, 6, false}, {L"brick4", 36, 4, 96, 1, false},
-      {L"classroom", 8, 16, 0, 7, false}, {L"maker10", 8, 24, 0, 3, false},   {L"maker11", 8, 24, 0, 4, false},
-      {L"maker12", 8, 24, 0, 25, false},  {L"maker13", 8, 24, 0, 26, false},  {L"maker14", 8, 24, 0, 29, false},
+      {L"classroom", 8, 16, 0, 7, false}, {L"maker10", 0, 24, 0, 3, false},   {L"maker11", 0, 24, 0, 4, false},
+      {L"maker12", 0, 24, 0, 25, false},  {L"maker13", 0, 24, 0, 26, false},  {L"maker14", 0, 24, 0, 29, false},
   };
   for (int nKind = 0; nKind < kNumbOfPlatformKinds; ++nKind) {
     SCOPED_TRACE(nKind);
@@ -249,7 +249,7 @@ TEST_F(HostCatalog, PortNamesFollowThePlatform) {
                           {platformNxt, 34, L"mtr_S4_C4_2"},    {platformNxt, 35, L""},
                           {platformBrick4Motor, 3, L"motorD"},  {platformBrick4Motor, 4, L"mtr_S1_C1_1"},
                           {platformVexPic, 9, L"port10"},       {platformVexPic, 10, L""},
-                          {platformArduino, 11, L"motor12"},    {platformBoard14, 12, L""},
+                          {platformArduino, 11, L"motor12"},    {platformBoard14, 0, L""},
                           {platformKind6, 0, L""},              {platformNxt, -1, L""}};
   for (const TCase &c : kPorts) {
     selectHostPlatform(c.nKind);

@@ -140,6 +140,10 @@ bool CRobotConfigurationBasic::SaveConfigurationAsModelFile(TTavrenFileTypes nFi
   }
   std::filesystem::path temporary;
   std::FILE *pFile = sPath.IsEmpty() ? nullptr : createFileBeside(target, temporary);
+  // A folder that takes no new file (or a name with no room for a suffix) may
+  // still let the file itself be replaced: then it is written in place.
+  const bool bInPlace = pFile == nullptr && !sPath.IsEmpty();
+  if (bInPlace) pFile = std::fopen(target.string().c_str(), "wb");
   if (!pFile) {
     reportModelFileNotOpened(sPath);
     return false;
@@ -153,6 +157,7 @@ bool CRobotConfigurationBasic::SaveConfigurationAsModelFile(TTavrenFileTypes nFi
   bWritten = std::fflush(pFile) == 0 && bWritten;
   bWritten = std::fclose(pFile) == 0 && bWritten;
 
+  if (bInPlace) return bWritten;
   if (bWritten) {
     // The model file keeps the permissions an earlier file of that name had.
     const std::filesystem::file_status status = std::filesystem::status(target, error);

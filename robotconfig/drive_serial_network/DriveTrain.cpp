@@ -43,6 +43,19 @@ CString menuWordOrNumber(const TDeviceTypeMenuItem *pTable, int nValue) {
   return sWord;
 }
 
+/// The value a drive-train, gripper or joystick word stands for: the catalog's
+/// row, else the number that menuWordOrNumber writes for a value without a
+/// word; -1 when it is neither.
+int menuValueOfWord(const TDeviceTypeMenuItem *pTable, const CString &sWord) {
+  const int nValue = getTypedefIndex(pTable, sWord, true);
+  if (nValue >= 0) return nValue;
+  bool bNumber = false;
+  const int nNumber = getInteger(sWord, bNumber);
+  CString sCanonical;
+  sCanonical.Format(L"%d", nNumber);
+  return bNumber && sCanonical == sWord ? nNumber : -1;
+}
+
 /// The word a written drive-train or gripper line uses for a slot's motor:
 /// its port name, or "None" for an empty slot or a motor without a name.
 CString slotMotorWord(const CRobotConfigurationBasic &rec, int nMotor, bool bEmpty) {
@@ -189,7 +202,7 @@ bool CRobotConfigurationBasic::bParseConfigDefinitionLineDriveTrainMotors(const 
     return false;
   }
   // A word the menu lacks is kept as a type with no motors (255).
-  settings.nDriveTrainType = static_cast<uint8_t>(getTypedefIndex(nDriveTrainTypes, parms.sParms[1], true));
+  settings.nDriveTrainType = static_cast<uint8_t>(menuValueOfWord(nDriveTrainTypes, parms.sParms[1]));
   bool bAccepted = true;
   const int nTokens = numbOfTokens(parms);
   for (int nToken = 2; nToken < nTokens; ++nToken) {
@@ -247,7 +260,7 @@ bool CRobotConfigurationBasic::bParseConfigDefinitionLineGripperArm(const TToken
     sError = L"Gripper Arm configuration not supported by platform";
     return false;
   }
-  settings.nGripperArmType = getTypedefIndex(nGripperArmTypes, parms.sParms[1], true);
+  settings.nGripperArmType = menuValueOfWord(nGripperArmTypes, parms.sParms[1]);
   bool bAccepted = true;
   const int nTokens = numbOfTokens(parms);
   for (int nToken = 2; nToken < nTokens; ++nToken) {
@@ -279,12 +292,12 @@ bool CRobotConfigurationBasic::bParseConfigDefinitionLineJoystickDrive(const TTo
     return false;
   }
   // Unknown words are reported but do not reject the line.
-  settings.nJoystickMotorDriveType = getTypedefIndex(nJoystickDriveTypes, parms.sParms[1], true);
+  settings.nJoystickMotorDriveType = menuValueOfWord(nJoystickDriveTypes, parms.sParms[1]);
   if (settings.nJoystickMotorDriveType < 0) {
     sError.Format(L"Invalid motor drive type '%s'", parms.sParms[1]);
     settings.nJoystickMotorDriveType = 0;
   }
-  settings.nJoystickMotorAxisScaling = getTypedefIndex(nJoystickAxisScalingTypes, parms.sParms[2], true);
+  settings.nJoystickMotorAxisScaling = menuValueOfWord(nJoystickAxisScalingTypes, parms.sParms[2]);
   if (settings.nJoystickMotorAxisScaling < 0) {
     sError.Format(L"Invalid joystick axis type '%s'", parms.sParms[2]);
     settings.nJoystickMotorAxisScaling = 0;

@@ -2,6 +2,7 @@
 // NetworkNode line per radio of the network. Reading registers networks and
 // radios that the IDE does not know yet; writing takes channel, date, node
 // names and hardware versions from those registries.
+#include "robotconfig/core/ParameterText.h"
 #include "robotconfig/core/RobotConfiguration.h"
 #include "robotconfig/host/HostMessages.h"
 #include "robotconfig/host/NetworkRegistry.h"
@@ -24,19 +25,6 @@ constexpr size_t kNodeName = 1;
 constexpr size_t kNodeSerialNumber = 2;
 constexpr size_t kNodeDate = 3;
 constexpr size_t kNodeHardwareVersion = 4;
-
-/// A parameter as it must be written for the tokenizer to read it back whole:
-/// between double quotes when it is empty or holds a blank, comma or parenthesis.
-CString parameterText(const CString &sParm) {
-  bool bQuote = sParm.IsEmpty();
-  for (int i = 0; i < sParm.GetLength() && !bQuote; ++i) {
-    const wchar_t c = sParm[i];
-    bQuote = c == L' ' || c == L'\t' || c == L',' || c == L'(' || c == L')';
-  }
-  // A text with a double quote of its own cannot be quoted; it is written as it is.
-  if (!bQuote || sParm.Find(L'"') >= 0) return sParm;
-  return CString(L'"') + sParm + L'"';
-}
 
 /// Whether a text is a date, as DateFieldFromCString reads one.
 bool bIsDate(const CString &sText) {
@@ -180,9 +168,9 @@ bool CRobotConfigurationBasic::buildSourceCodeForMultiNetworks() {
   Networking::CStringFromNodeSerialNumber(sSerialNumber, &nPrimaryAddress);
   CStringFromDateField(&sDate, &network.date);
   sLine.Format(L"#pragma config(%s, %s, %s, %s, %s, %s, %s, %s)",
-               TConfigTypeDefns::getConfigTypeName(configTypeNetworkDefinition), parameterText(pNtwkInfo->sNetworkName),
-               parameterText(sPrimaryName), parameterText(Networking::getNetworkTypeString(pNtwkInfo->nNetworkType)),
-               sNumber, sChannel, sSerialNumber, parameterText(sDate));
+               TConfigTypeDefns::getConfigTypeName(configTypeNetworkDefinition), textAsParameter(pNtwkInfo->sNetworkName),
+               textAsParameter(sPrimaryName), textAsParameter(Networking::getNetworkTypeString(pNtwkInfo->nNetworkType)),
+               sNumber, sChannel, sSerialNumber, textAsParameter(sDate));
   addSourceLineToConfiguration(sLine);
 
   CString sName, sVersion;
@@ -193,7 +181,7 @@ bool CRobotConfigurationBasic::buildSourceCodeForMultiNetworks() {
     Networking::CStringFromNodeSerialNumber(sSerialNumber, &pNode->nSerialNumber);
     CStringFromHardwareVersion(sVersion, pNode->getHardwareVersion());
     sLine.Format(L"#pragma config(%s, %s, %s, %s)", TConfigTypeDefns::getConfigTypeName(configTypeNetworkNode),
-                 parameterText(sName), sSerialNumber, sVersion);
+                 textAsParameter(sName), sSerialNumber, sVersion);
     addSourceLineToConfiguration(sLine);
   }
   return true;

@@ -18,9 +18,9 @@ constexpr uint32_t kVexPlatforms = platformBit(platformVexPic) | platformBit(pla
 constexpr uint32_t kBoardPlatforms = platformBit(platformBoard10) | platformBit(platformBoard11) |
                                      platformBit(platformBoard12) | platformBit(platformBoard13) |
                                      platformBit(platformBoard14);
-/// Platforms whose motors are called "motor1", "motor2", ...
+/// Platforms whose motors are called "motor1", "motor2", ... (the board kinds have no motor port).
 constexpr uint32_t kNumberedMotorPlatforms = platformBit(platformArduino) | platformBit(platformSharedPorts) |
-                                             platformBit(platformKind9) | kBoardPlatforms;
+                                             platformBit(platformKind9);
 
 /// Third-party mask of every catalog row: all hardware vendors but bit 0.
 constexpr int32_t kAnyThirdPartyHardware = 0xFE;

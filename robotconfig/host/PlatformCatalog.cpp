@@ -20,11 +20,13 @@ constexpr std::array<TPlatformMotorParms, kNumbOfPlatformKinds> kMotorParms = {{
     {12},  // platformSharedPorts
     {36},  // platformBrick4Motor: 4 built-in ports + 32 hub-motor indexes
     {8},   // platformKind9
-    {8},   // platformBoard10
-    {8},   // platformBoard11
-    {8},   // platformBoard12
-    {8},   // platformBoard13
-    {8},   // platformBoard14
+    // The motor-type rules give the board kinds no motor type, so they offer
+    // no motor port: a Motor line there is refused instead of read as no motor.
+    {0},   // platformBoard10
+    {0},   // platformBoard11
+    {0},   // platformBoard12
+    {0},   // platformBoard13
+    {0},   // platformBoard14
 }};
 
 // Columns: name, sensor ports, servo ports, board selection, first motor can

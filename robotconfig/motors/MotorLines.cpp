@@ -2,6 +2,7 @@
 #include <array>
 #include <string_view>
 
+#include "robotconfig/core/ParameterText.h"
 #include "robotconfig/core/RobotConfiguration.h"
 #include "robotconfig/host/DeviceCatalog.h"
 #include "robotconfig/host/Platform.h"
@@ -101,18 +102,6 @@ int hubTypeOfWord(const CString &sWord) {
   return -1;
 }
 
-
-// Characters that end an unquoted parameter of a configuration line.
-constexpr std::wstring_view kParameterBreaks = L" \t,()";
-
-// A name as a line must carry it to be read back whole: between double quotes
-// when it holds a character that would end the parameter. A name with a double
-// quote of its own cannot be quoted and is written as it is.
-CString nameAsParameter(const CString &sName) {
-  const std::wstring &s = sName.str();
-  if (s.find_first_of(kParameterBreaks) == std::wstring::npos || sName.Find(L'"') >= 0) return sName;
-  return CString(L'"') + sName + L'"';
-}
 
 }  // namespace
 

@@ -147,10 +147,15 @@ void CRobotConfigurationBasic::setMotorIOPinsInConfig(int nMotor, int nPrimary, 
         setMotorTypeInConfig(nOldPin, 0);
       calculateI2CUsage();
     }
-    *update.pPin = update.nNewPin;
     // A pin index from a line is never trusted to lie inside the sensor ports.
-    if (update.nNewPin >= 0 && update.nNewPin < kMaxNumbOfSensorPorts)
-      setSensorTypeInConfig(update.nNewPin, update.nPinSensorType);
+    const bool bSensorPort = update.nNewPin >= 0 && update.nNewPin < kMaxNumbOfSensorPorts;
+    // A pin another motor holds is taken from it: that motor lets it go.
+    if (bSensorPort) {
+      const TSensorTypes nHeld = settings.nSensorTypes[size_t(update.nNewPin)];
+      if (nHeld >= 57 && nHeld <= 59) removeSensorTypeInConfig(update.nNewPin);
+    }
+    *update.pPin = update.nNewPin;
+    if (bSensorPort) setSensorTypeInConfig(update.nNewPin, update.nPinSensorType);
   }
 }
 

@@ -1,6 +1,7 @@
 #include "robotconfig/motors/MotorTypes.h"
 
 #include "robotconfig/core/RobotConfiguration.h"
+#include "robotconfig/host/DeviceCatalog.h"
 #include "robotconfig/host/Platform.h"
 
 namespace {
@@ -184,6 +185,28 @@ void CRobotConfigurationBasic::setMotorTypeInConfig(int nMotor, TMotorTypes nTyp
       if (nDriveMotor == nMotor) nDriveMotor = 255;
 }
 
+namespace {
+
+/// The type a legacy motor type becomes on this platform: the first of its
+/// modern target, the type the conversion column gives for the target, and
+/// the legacy type itself that the platform has and the motor's port can
+/// drive (so that a line can name it there); failing that, the first the
+/// platform has; 0 when it has none of them.
+TMotorTypes modernTypeOfLegacy(const CRobotConfigurationBasic &config, int nMotor, TMotorTypes nLegacy,
+                               TMotorTypes nTarget) {
+  const TSensorHWTypesMask nHardwareMask = config.getAorDMotorTypeMask(nMotor);
+  const TMotorTypes candidates[] = {nTarget, resolveMotorTypeForPlatform(nTarget), nLegacy};
+  TMotorTypes nFirstOnPlatform = 0;
+  for (const TMotorTypes nType : candidates) {
+    if (nType == 0 || !getMotorCharacteristics(nType)) continue;
+    if (*getMotorTypedefString(nType, nHardwareMask) != L'\0') return nType;
+    if (nFirstOnPlatform == 0) nFirstOnPlatform = nType;
+  }
+  return nFirstOnPlatform;
+}
+
+}  // namespace
+
 void CRobotConfigurationBasic::normalizeLegacyMotorConfiguration(int nMotor) {
   if (!bIsMotorIndex(nMotor)) return;
   TMotorSlot &motor = settings.motors[size_t(nMotor)];
@@ -202,11 +225,11 @@ void CRobotConfigurationBasic::normalizeLegacyMotorConfiguration(int nMotor) {
     case 17: case 18: case 19: case 20: case 21: case 22: case 23: case 24: case 25:
       break;
     case 26: case 27: case 28: case 29:
-      setMotorTypeInConfig(nMotor, 17);
+      setMotorTypeInConfig(nMotor, modernTypeOfLegacy(*this, nMotor, nType, 17));
       takeLegacyFlags();
       break;
     case 30: case 31:
-      setMotorTypeInConfig(nMotor, 20);
+      setMotorTypeInConfig(nMotor, modernTypeOfLegacy(*this, nMotor, nType, 20));
       takeLegacyFlags();
       break;
     default:

@@ -5,6 +5,7 @@
 #include <string>
 #include <system_error>
 
+#include "robotconfig/core/ParameterText.h"
 #include "robotconfig/host/HostMessages.h"
 #include "robotconfig/program/ProgramText.h"
 
@@ -114,16 +115,6 @@ bool bReadUserModelLine(CHostRobotConfiguration &config, const TTokenizedConfigP
   return true;
 }
 
-// Characters that end an unquoted token of a configuration line.
-bool bNeedsQuotes(const CString &sParm) {
-  if (sParm.IsEmpty()) return true;  // a trailing empty parameter would be dropped
-  for (int i = 0; i < sParm.GetLength(); ++i) {
-    const wchar_t c = sParm[i];
-    if (c == L' ' || c == L'\t' || c == L',' || c == L'(' || c == L')') return true;
-  }
-  return sParm[0] == L'"';
-}
-
 }  // namespace
 
 void CHostRobotConfiguration::copyFrom(const CRobotConfigurationBasic &source) {
@@ -134,6 +125,14 @@ void CHostRobotConfiguration::copyFrom(const CRobotConfigurationBasic &source) {
       m_nSeriesHash = pHost->m_nSeriesHash;
     }
   }
+}
+
+TConfigCompareResults CHostRobotConfiguration::compareConfiguration(const CRobotConfigurationBasic &other) const {
+  const TConfigCompareResults nResult = CRobotConfigurationBasic::compareConfiguration(other);
+  if (nResult == configCompareSettingsDiffer) return nResult;
+  const auto *pHost = dynamic_cast<const CHostRobotConfiguration *>(&other);
+  if (pHost != nullptr && pHost->m_datalogSeries != m_datalogSeries) return configCompareSettingsDiffer;
+  return nResult;
 }
 
 void CHostRobotConfiguration::clearConfigurationDefinition() {
@@ -160,8 +159,7 @@ bool CHostRobotConfiguration::buildSourceCodeForDatalogSeries() {
     CString sLine(L"#pragma config(DatalogSeries");
     for (const CString &sParm : series) {
       sLine += L", ";
-      if (bNeedsQuotes(sParm) && sParm.Find(L'"') < 0) sLine += L'"' + sParm + L'"';
-      else sLine += sParm;
+      sLine += textAsParameter(sParm);
     }
     sLine += L')';
     addSourceLineToConfiguration(sLine);

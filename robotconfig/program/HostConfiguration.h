@@ -25,6 +25,9 @@ class CHostRobotConfiguration : public CRobotConfigurationBasic {
   void clearConfigurationDefinition() override;
   /// Also carries the data-log series of another host configuration.
   void copyFrom(const CRobotConfigurationBasic &source) override;
+  /// Also compares the data-log series themselves with those of another host
+  /// configuration: equal fingerprints do not make equal series.
+  TConfigCompareResults compareConfiguration(const CRobotConfigurationBasic &other) const override;
 
   /// The parameters of each "DatalogSeries" line read, in order.
   const std::vector<std::vector<CString>> &getDatalogSeries() const { return m_datalogSeries; }

@@ -16,6 +16,8 @@ constexpr TSensorTypes kSensorI2CPin = 61;
 constexpr TSensorTypes kSensorI2CEncoder = 67;
 constexpr TSensorTypes kSensorI2CBus = 68;
 constexpr TSensorTypes kSensorSharedMotorPort = 91;
+// A motor's primary, secondary and two-pin IO pins.
+constexpr std::array<TSensorTypes, 3> kMotorIOPinTypes = {57, 58, 59};
 
 // I2C usage "i2cSensors" of the I2C port vocabulary.
 constexpr int32_t kI2CUsageSensors = 2;
@@ -120,6 +122,12 @@ void CRobotConfigurationBasic::removeSensorTypeInConfig(int nPort) {
     clearSensorTypeAndModeInConfig(nPort + 1);
   } else if (bIsSecondHalfType(nType)) {
     clearSensorTypeAndModeInConfig(nPort - 1);
+  } else if (bIsOneOf(kMotorIOPinTypes, nType)) {
+    // The motor lets the pin go, so that no two devices claim one port.
+    for (TMotorSlot &motor : settings.motors) {
+      if (motor.nPrimaryIOPin == nPort) motor.nPrimaryIOPin = -1;
+      if (motor.nSecondaryIOPin == nPort) motor.nSecondaryIOPin = -1;
+    }
   } else if (nType == kSensorUartPin || nType == kSensorI2CPin) {
     int nSerialPort = -1, nFirstPin = -1, nSecondPin = -1;
     const bool bUart = nType == kSensorUartPin;

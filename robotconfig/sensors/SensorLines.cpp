@@ -2,6 +2,7 @@
 #include <array>
 #include <initializer_list>
 
+#include "robotconfig/core/ParameterText.h"
 #include "robotconfig/core/RobotConfiguration.h"
 #include "robotconfig/host/DeviceCatalog.h"
 #include "robotconfig/host/Platform.h"
@@ -168,7 +169,7 @@ bool CRobotConfigurationBasic::buildSourceCodeForSensors() {
 
     const TSensorModes nMode = settings.nSensorModes[size_t(port)];
     const CString sPortColumn = CString(::getSensorPortString(port, settings.nCircuitBoardType)) + L",";
-    const CString sNameColumn = sName + L",";
+    const CString sNameColumn = nameAsParameter(sName) + L",";
     CString sTypeColumn = getSensorTypeString(nType);
     const CString sModeString = getSensorModeString(nType, nMode);
     const CString sModeColumn = (nMode != 0 && !sModeString.IsEmpty()) ? CString(L", ") + sModeString : CString();
@@ -199,6 +200,6 @@ void CRobotConfigurationBasic::buildSourceCodeForRenameSensor(int nPort) {
   if (!bIsSensorIndex(nPort)) return;
   CString sLine;
   sLine.Format(L"#pragma config(%s, %s, %s)", TConfigTypeDefns::getConfigTypeName(configTypeRenameSensor),
-               ::getSensorPortString(nPort, settings.nCircuitBoardType), sSensorNames[size_t(nPort)]);
+               ::getSensorPortString(nPort, settings.nCircuitBoardType), nameAsParameter(sSensorNames[size_t(nPort)]));
   addSourceLineToConfiguration(sLine);
 }

@@ -1,5 +1,6 @@
 #include <algorithm>
 
+#include "robotconfig/core/ParameterText.h"
 #include "robotconfig/core/RobotConfiguration.h"
 #include "robotconfig/host/DeviceCatalog.h"
 #include "robotconfig/host/Platform.h"
@@ -64,7 +65,7 @@ bool CRobotConfigurationBasic::buildSourceCodeForServos() {
     if (!bIsValidServoPort(i)) continue;
     getDefaultServoNameLowLevel(i, sPort, true);
     sLine.Format(L"#pragma config(%s,  %-16s %-21s %s)", TConfigTypeDefns::getConfigTypeName(configTypeServo),
-                 sPort + L",", sName + L",", getServoTypedefString(nType));
+                 sPort + L",", nameAsParameter(sName) + L",", getServoTypedefString(nType));
     addSourceLineToConfiguration(sLine);
     bWritten = true;
   }
@@ -85,7 +86,7 @@ bool CRobotConfigurationBasic::buildSourceCodeForServoPositions() {
       sValues.Format(L"%s, %3d", sSoFar, positions[size_t(j)]);
     }
     sLine.Format(L"#pragma config(%s,  %-22s %s)", TConfigTypeDefns::getConfigTypeName(configTypeServoPosition),
-                 sName + L",", sValues);
+                 nameAsParameter(sName) + L",", sValues);
     addSourceLineToConfiguration(sLine);
     bWritten = true;
   }
