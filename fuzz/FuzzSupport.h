@@ -35,6 +35,7 @@ inline void selectPlatformFromInput(const uint8_t *&data, size_t &size) {
 
 /// Stops the run when an invariant does not hold.
 inline void fuzzCheck(bool bHolds, const char *pzWhat);
+inline void checkOnlyUnwritableSlotsRefused(const std::vector<TConfigurationDiagnostic> &refused);
 
 /// The settled block of `config`; false for the one case the rules leave
 /// unsettled: a drive train or gripper whose line left slots empty writes
@@ -44,9 +45,43 @@ inline bool bSettles(CHostRobotConfiguration &config, CString &sBlock) {
   std::vector<TConfigurationDiagnostic> refused;
   if (generateSettledBlock(config, sBlock, &refused)) return true;
   fuzzCheck(!refused.empty(), "the generated block settles");
+  checkOnlyUnwritableSlotsRefused(refused);
+  return false;
+}
+
+/// Stops the run unless the lines refused in a generated block are the one
+/// case the rules leave unwritable: a drive train or gripper whose line left
+/// slots empty writes "None" there, which the readers refuse (all drive-train
+/// slots, gripper slots 0 and 2).
+inline void checkOnlyUnwritableSlotsRefused(const std::vector<TConfigurationDiagnostic> &refused) {
   for (const TConfigurationDiagnostic &line : refused)
     fuzzCheck(line.sMessage.Find(L"No motor specified for index") == 0, "the generated block reads back");
-  return false;
+}
+
+/// Checks that the block `config` writes reads back to a record that writes
+/// the same block again. Two rules may change it once, and only they: a board
+/// word that names no board falls back to the IDE's board, and the I2C use
+/// "i2cSensors" follows the sensors. False when the block cannot be read back
+/// (the unwritable drive-train and gripper slots).
+inline bool bReadsBackToItself(CHostRobotConfiguration &config) {
+  CString sBlock;
+  config.buildSourceCodeForConfiguration(sBlock, false);
+  // Reading again must neither move the IDE's board nor repeat the warnings.
+  CHostSelectionScope selection;
+  CCapturingMessageSink quiet;
+  CHostRobotConfiguration reread;
+  const std::vector<TConfigurationDiagnostic> refused = readProgramConfiguration(reread, CProgramText(sBlock.toUtf8()));
+  if (!refused.empty()) {
+    checkOnlyUnwritableSlotsRefused(refused);
+    return false;
+  }
+  CString sAgain;
+  reread.buildSourceCodeForConfiguration(sAgain, false);
+  if (sAgain == sBlock) return true;
+  const TConfigurationSettings &before = config.getSettings(), &after = reread.getSettings();
+  fuzzCheck(before.nCircuitBoardType != after.nCircuitBoardType || before.nI2CMode[0] != after.nI2CMode[0],
+            "the generated block reads back to itself");
+  return true;
 }
 
 /// Stops the run when an invariant does not hold.

@@ -5,6 +5,7 @@
 #include <map>
 #include <set>
 #include <string>
+#include <utility>
 #include <vector>
 
 #include "robotconfig/checker/Finding.h"
@@ -66,6 +67,9 @@ class CCheckContext {
   std::vector<TSensorTypes> sensorTypesBefore;
   /// Reading left the IDE's board as it found it, so the block reads back from the same start.
   bool bBoardKept = false;
+  /// Primary and secondary IO pin of every motor just before the current line
+  /// (a motor lets a pin go when a later line takes it).
+  std::vector<std::pair<int, int>> motorPinsBefore;
 };
 
 /// UTF-8 of a wide text.

@@ -131,11 +131,12 @@ void checkMotorPins(CCheckContext &context, TCheckedLine &line) {
   const int nMotor = config.getIndexForDefaultMotorName(line.parms.sParms[1]);
   if (!CRobotConfigurationBasic::bIsMotorIndex(nMotor) || config.getMotorTypeInConfig(nMotor) == 0) return;
   const int pins[2] = {config.getMapMotorToPrimaryIOPin(nMotor), config.getMapMotorToSecondaryIOPin(nMotor)};
-  for (int m = 0; m < kMaxNumbOfMotors; ++m) {
+  for (int m = 0; m < kMaxNumbOfMotors && size_t(m) < context.motorPinsBefore.size(); ++m) {
     if (m == nMotor || config.getMotorTypeInConfig(m) == 0) continue;
+    // The pins the other motor held before this line: it lets go of one this line takes.
+    const std::pair<int, int> &held = context.motorPinsBefore[size_t(m)];
     for (int nPin : pins) {
-      if (nPin < 0 || (nPin != config.getMapMotorToPrimaryIOPin(m) && nPin != config.getMapMotorToSecondaryIOPin(m)))
-        continue;
+      if (nPin < 0 || (nPin != held.first && nPin != held.second)) continue;
       const TLineNumber &other = config.getMotorDefinitionLine(m);
       CString sName;
       config.getUserDefinedMotorNameInConfig(m, sName);

@@ -55,6 +55,9 @@ class CLineChecker : public CReadingObserver {
     m_context.lines.push_back(std::move(line));
     const TConfigurationSettings &settings = m_context.config.getSettings();
     m_context.sensorTypesBefore.assign(settings.nSensorTypes.begin(), settings.nSensorTypes.end());
+    m_context.motorPinsBefore.clear();
+    for (const TMotorSlot &motor : settings.motors)
+      m_context.motorPinsBefore.emplace_back(motor.nPrimaryIOPin, motor.nSecondaryIOPin);
   }
 
   void afterLine(int, const TTokenizedConfigParms &, bool bAccepted) override {

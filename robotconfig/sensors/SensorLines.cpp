@@ -173,7 +173,8 @@ bool CRobotConfigurationBasic::buildSourceCodeForSensors() {
     CString sTypeColumn = getSensorTypeString(nType);
     const CString sModeString = getSensorModeString(nType, nMode);
     const CString sModeColumn = (nMode != 0 && !sModeString.IsEmpty()) ? CString(L", ") + sModeString : CString();
-    CString sSecondaryColumn = getSensorSecondaryPort(settings.nSecondaryPorts[size_t(port)]);
+    // A port without a sensor keeps only its name when read, so nothing else is written for it.
+    CString sSecondaryColumn = nType == 0 ? CString() : CString(getSensorSecondaryPort(settings.nSecondaryPorts[size_t(port)]));
     const CString sI2CColumn = i2cColumn(nType, settings.nI2CAddresses[size_t(port)]);
 
     CString sLine;
