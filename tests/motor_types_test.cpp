@@ -294,9 +294,9 @@ std::string typeDefaults(int nKind, bool bToggle) {
 }  // namespace
 
 TEST_F(MotorRules, TypeDefaultsPerPlatform) {
-  EXPECT_EQ(typeDefaults(platformVexPic, false), "2:W 3:W 4:RW 5:RW 10:W 11:W 12:W 13:W 26: 29:RW ");
-  EXPECT_EQ(typeDefaults(platformVexI2c, false), "2:W 3:W 4:RW 5:RW 6:W 7:W 8:W 9:W 10:W 11:W 12:W 13:W 26: 29:RW ");
+  EXPECT_EQ(typeDefaults(platformVexPic, false), "2:W 3:W 4:RW 5:RW 10:W 11:W 12:W 13:W 26:W 29:RW ");
+  EXPECT_EQ(typeDefaults(platformVexI2c, false), "2:W 3:W 4:RW 5:RW 6:W 7:W 8:W 9:W 10:W 11:W 12:W 13:W 26:W 29:RW ");
   EXPECT_EQ(typeDefaults(platformNxt, true), "2:W 3:W 17:P 20:W 21:W 26:W 27:W 28:P 29:RW 30:W 31:PW ");
   EXPECT_EQ(typeDefaults(platformKind9, false), "2:W 3:W 4:RW 5:RW 26: 29:RW ");
-  EXPECT_EQ(typeDefaults(platformSharedPorts, false), "2:W 3:W 4:RW 5:RW 14:PW 26: 29:RW ");
+  EXPECT_EQ(typeDefaults(platformSharedPorts, false), "2:W 3:W 4:RW 5:RW 14:PW 26:W 29:RW ");
 }
