@@ -6,7 +6,7 @@ GENERATOR := $(shell command -v ninja >/dev/null 2>&1 && echo "-G Ninja")
 JOBS ?= $(shell nproc 2>/dev/null || echo 2)
 ROBOTCFG = ./$(BUILD_DIR)/robotcfg
 
-.PHONY: all configure build man demo test asan-test ci clean deps goldens coverage fuzz bench
+.PHONY: all configure build man demo test asan-test ci clean deps goldens coverage fuzz fuzz-build fuzz-long bench
 
 all: build
 
@@ -56,23 +56,27 @@ coverage:
 	  --print-summary --txt $(COVERAGE_BUILD_DIR)/coverage.txt
 
 # Runs every fuzz harness for FUZZ_SECONDS each (clang with libFuzzer and the sanitizers).
+# Each run takes a fresh seed and prints it; `make fuzz FUZZ_SEED=N` repeats a run.
+# A failing input is saved under $(FUZZ_BUILD_DIR) as HARNESS-crash-... and the
+# reproducer command is printed.
 FUZZ_BUILD_DIR ?= build-fuzz
 FUZZ_SECONDS ?= 60
-# A fixed seed makes a run repeatable: a longer run covers what a shorter one tries.
-FUZZ_SEED ?= 1
-fuzz:
+ifndef FUZZ_SEED
+FUZZ_SEED := $(shell od -An -N4 -tu4 /dev/urandom | tr -d ' ')
+endif
+FUZZ_JOBS ?= 1
+fuzz-build:
 	@$(CMAKE) -S . -B $(FUZZ_BUILD_DIR) $(GENERATOR) -DCMAKE_CXX_COMPILER=clang++ -DROBOTCONFIG_SANITIZE=ON \
 	  -DROBOTCONFIG_BUILD_FUZZERS=ON -DROBOTCONFIG_BUILD_TESTS=OFF >/dev/null
 	$(CMAKE) --build $(FUZZ_BUILD_DIR) -j $(JOBS)
-	@set -e; for harness in fuzz/fuzz_*.cpp; do \
-	  name=$$(basename $$harness .cpp); \
-	  work=$(FUZZ_BUILD_DIR)/corpus/$$name; mkdir -p $$work; \
-	  echo "== $$name for $(FUZZ_SECONDS) s"; \
-	  $(FUZZ_BUILD_DIR)/fuzz/$$name -seed=$(FUZZ_SEED) -max_total_time=$(FUZZ_SECONDS) -max_len=4096 -print_final_stats=1 \
-	    -artifact_prefix=$(FUZZ_BUILD_DIR)/$$name- $$work fuzz/corpus/$$name 2>&1 | \
-	    grep -E '^(stat::number_of_executed_units|stat::average_exec_per_sec|==[0-9]+==|SUMMARY|Done)' || true; \
-	  if ls $(FUZZ_BUILD_DIR)/$$name-* >/dev/null 2>&1; then echo "$$name found a failing input"; exit 1; fi; \
-	done
+
+fuzz: fuzz-build
+	@echo "fuzz seed $(FUZZ_SEED) (repeat with: make fuzz FUZZ_SEED=$(FUZZ_SEED))"
+	@ls fuzz/fuzz_*.cpp | xargs -n 1 -P $(FUZZ_JOBS) sh fuzz/run_harness.sh $(FUZZ_BUILD_DIR) $(FUZZ_SECONDS) $(FUZZ_SEED)
+
+# The harnesses for as long as asked (FUZZ_SECONDS each, default an hour), two at a time.
+fuzz-long:
+	@$(MAKE) --no-print-directory fuzz FUZZ_SECONDS=$${FUZZ_SECONDS:-3600} FUZZ_JOBS=2
 
 # The benchmarks (Google Benchmark), then the 10,000-program corpus timed against grep.
 BENCH_BUILD_DIR ?= build-bench

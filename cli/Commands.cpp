@@ -18,13 +18,18 @@ namespace {
 bool settledBlock(const std::string &sPath, const TReadProgram &program, CString &sBlock, bool *pHeld = nullptr) {
   std::vector<TConfigurationDiagnostic> refused;
   if (generateSettledBlock(*program.pConfig, sBlock, &refused, program.pText.get(), pHeld)) return true;
+  // In the user's words: what to change, not what the writer did.
   if (refused.empty()) {
-    std::fprintf(stderr, "%s: error: the configuration block does not settle when it is regenerated\n",
+    std::fprintf(stderr,
+                 "%s: error: the configuration cannot be written: each regeneration of the block gives another; "
+                 "run 'robotcfg check' and change the lines it reports\n",
                  displayName(sPath).c_str());
   }
   for (const TConfigurationDiagnostic &line : refused)
-    std::fprintf(stderr, "%s: error: the regenerated block would not read back: %s\n", displayName(sPath).c_str(),
-                 line.sMessage.toUtf8().c_str());
+    std::fprintf(stderr,
+                 "%s: error: the configuration cannot be written back: a regenerated line would be refused (%s); "
+                 "run 'robotcfg check' for the line to change\n",
+                 displayName(sPath).c_str(), line.sMessage.toUtf8().c_str());
   return false;
 }
 

@@ -90,6 +90,10 @@ TEST(Mistakes, CheckReportsWhatIsRecorded) {
   // cannot write, which the rules before it leave no program to produce.
   size_t nRules = 0;
   const TCheckRule *pRules = checkRules(nRules);
+  const std::string sDocs = readFile(fs::path(ROBOTCONFIG_SOURCE_DIR) / "docs/DIAGNOSTICS.md");
+  for (size_t i = 0; i < nRules; ++i)
+    EXPECT_NE(sDocs.find(std::string("\n## ") + pRules[i].pzCode + "\n"), std::string::npos)
+        << pRules[i].pzCode << " has no section in docs/DIAGNOSTICS.md";
   for (size_t i = 0; i < nRules; ++i)
     EXPECT_TRUE(codesSeen.count(pRules[i].pzCode) || std::string(pRules[i].pzCode) == "RC902")
         << "no mistake shows " << pRules[i].pzCode;

@@ -149,8 +149,27 @@ void checkMotorPins(CCheckContext &context, TCheckedLine &line) {
   }
 }
 
+// Gripper slots that may stay empty (the second motor of each joint).
+constexpr bool kOptionalGripperSlot[] = {false, true, false, true};
+
+// A drive train or gripper arm with a slot left without a motor.
+void checkSlotCount(CCheckContext &context, TCheckedLine &line) {
+  const CHostRobotConfiguration &config = context.config;
+  const bool bDrive = line.nType == configTypeDriveTrainMotors;
+  const int nNeeded = bDrive ? config.getNumbOfMotorsForDriveTrain() : config.getNumbOfMotorsForGripperArm();
+  const int nNamed = std::max(0, line.parms.nNumbOfParms - 2);
+  for (int nSlot = nNamed; nSlot < nNeeded && nSlot < 4; ++nSlot) {
+    if (!bDrive && kOptionalGripperSlot[nSlot]) continue;
+    context.report(line, "RC014", line.parms.nNumbOfParms - 1,
+                   quoted(line.parms.sParms[1]) + " drives " + std::to_string(nNeeded) + " motors, but the line names " +
+                       std::to_string(nNamed) + "; slot " + std::to_string(nSlot) + " needs a motor");
+    return;
+  }
+}
+
 // A motor named in two slots of a drive train or gripper arm.
 void checkSlots(CCheckContext &context, TCheckedLine &line) {
+  checkSlotCount(context, line);
   std::map<std::wstring, int> seen;
   for (int n = 2; n < line.parms.nNumbOfParms && n < kMaxConfigTokens; ++n) {
     const CString &sWord = line.parms.sParms[size_t(n)];

@@ -23,6 +23,9 @@ constexpr TCheckRule kRules[] = {
      "the words."},
     {"RC013", "ignored-parameter", kWarning, "The keyword ignores a parameter.",
      "The parameter has no effect and is not written back; remove it."},
+    {"RC014", "missing-motor", kError, "A drive train or gripper arm names fewer motors than it drives.",
+     "The regenerated line would name 'None' for the missing motors, which does not read back; name a motor "
+     "for every slot."},
     {"RC101", "unknown-word", kError, "A word is none of the words its position accepts.",
      "The record replaces an unknown word by its 'none' value, so the device or setting is lost; use one "
      "of the suggested words."},
