@@ -95,7 +95,16 @@ const wchar_t *getServoTypedefString(TServoTypes nType) { return findKeywordOfVa
 
 TServoTypes getServoTypedefNameIndex(const CString &sText) { return findValueOfKeyword(kServoTypeNames, sText, kAnyRow); }
 
-const wchar_t *getSensorTypeString(TSensorTypes nType) { return findKeywordOfValue(kSensorTypeNames, nType, kAnyRow); }
+const wchar_t *getSensorTypeString(TSensorTypes nType) {
+  // A record may hold a type its platform does not offer (set by a host or
+  // carried from another platform); it keeps its word so that nothing is
+  // written empty.
+  const wchar_t *pzWord = findKeywordOfValue(kSensorTypeNames, nType, kAnyRow);
+  if (*pzWord != 0) return pzWord;
+  for (const TDeviceTypeMenuItem *pRow = kSensorTypeNames; !bIsEndOfTable(*pRow); ++pRow)
+    if (pRow->nValue == nType && pRow->pzKeyword) return pRow->pzKeyword;
+  return L"";
+}
 
 TSensorTypes getSensorTypeIndex(const CString &sText, bool /*bExact*/) {
   return findValueOfKeyword(kSensorTypeNames, sText, kAnyRow);
