@@ -11,6 +11,9 @@ namespace {
 
 // Lines with an error before a hint is worth the extra reads.
 constexpr int kFailingLinesForHint = 2;
+// Configuration lines beyond which the reads on every platform cost too much:
+// real blocks hold a few dozen.
+constexpr size_t kMaxLinesForHint = 1000;
 
 }  // namespace
 
@@ -18,7 +21,7 @@ void suggestOtherPlatforms(CCheckContext &context, const CProgramText &program) 
   std::set<int> failingLines;
   for (const TFinding &finding : context.findings)
     if (finding.nSeverity == TSeverity::kError && finding.nLine > 0) failingLines.insert(finding.nLine);
-  if (int(failingLines.size()) < kFailingLinesForHint) return;
+  if (int(failingLines.size()) < kFailingLinesForHint || context.lines.size() > kMaxLinesForHint) return;
   const int nCurrent = pToggles->getPlatformKind();
   const bool bToggle = pToggles->bIsToggleEnabled(kToggleExternalControllers, kToggleQueryLevel) != 0;
   std::string sClean;
