@@ -94,7 +94,8 @@ void checkRegeneratedBlock(CCheckContext &context) {
     if (refused.empty()) {
       TFinding finding;
       finding.sCode = "RC902";
-      finding.sMessage = "the configuration does not settle: each regeneration of the block gives another block";
+      finding.sMessage = "the configuration cannot be written: the block changes each time it is regenerated; check the "
+                         "board, controller and I2C lines, which the other lines depend on";
       context.findings.push_back(std::move(finding));
     }
     return;
