@@ -175,10 +175,10 @@ TEST(Cli, HelpAndVersionGoToStandardOutput) {
 TEST(Cli, FormatWritesNothingWhenALineIsRejected) {
   CTempDir dir;
   const std::string sFile = dir.file("p.c");
-  const std::string sProgram = "#pragma config(UserModel, \"m.txt\")\n#pragma config(Sensr, S1, bumper)\nint x;\n";
+  const std::string sProgram = "#pragma config(UserModel, \"m.txt\")\n#pragma config(Gizmo, S1, bumper)\nint x;\n";
   writeFile(sFile, sProgram);
   writeFile(dir.file("m.txt"), "");
-  const std::string sError = sFile + ":2: error: Bad parameter type: 'Sensr'\n";
+  const std::string sError = sFile + ":2: error: Bad parameter type: 'Gizmo'\n";
   for (const std::vector<std::string> &args : {std::vector<std::string>{"format", sFile},
                                                std::vector<std::string>{"format", "-i", sFile},
                                                std::vector<std::string>{"format", "--check", sFile},

@@ -24,6 +24,7 @@ struct TCheckedLine {
   bool bAccepted = false;
   bool bFlagged = false;  ///< a finding of warning or error weight stands on it
   std::set<int> reportedParms;  ///< parameters a finding (of any weight) is about
+  std::vector<std::wstring> keywordSuggestions;  ///< for a refused line with an unknown keyword
   CString sLineText;
 };
 

@@ -4,6 +4,7 @@
 
 #include "robotconfig/checker/CheckContext.h"
 #include "robotconfig/checker/RuleTable.h"
+#include "robotconfig/checker/WordSuggestions.h"
 #include "robotconfig/host/HostMessages.h"
 #include "robotconfig/host/Platform.h"
 
@@ -39,6 +40,14 @@ TFinding &CCheckContext::report(TCheckedLine &line, const char *pzCode, int nPar
 
 namespace {
 
+// The configuration keywords closest to a word no keyword matches.
+std::vector<std::wstring> closestKeywords(const CString &sWord) {
+  std::vector<std::wstring> keywords;
+  for (TConfigTypes nType = 0; nType < kNumbOfConfigTypes; ++nType)
+    keywords.push_back(TConfigTypeDefns::getConfigTypeName(nType));
+  return closestWords(sWord.str(), keywords);
+}
+
 // Watches the road: keeps each line with its layout and runs the line rules
 // right after the reader, while the record holds what the line left.
 class CLineChecker : public CReadingObserver {
@@ -63,8 +72,11 @@ class CLineChecker : public CReadingObserver {
   void afterLine(int, const TTokenizedConfigParms &, bool bAccepted) override {
     TCheckedLine &line = m_context.lines.back();
     line.bAccepted = bAccepted;
-    // A refused line has its reader's message; more about it would be noise.
-    if (!bAccepted) return;
+    // A refused line has its reader's message; only a misspelt keyword gets a hint.
+    if (!bAccepted) {
+      if (line.nType == configTypeNotFound) line.keywordSuggestions = closestKeywords(line.parms.sParms[0]);
+      return;
+    }
     checkLineSyntax(m_context, line);
     // Reading stopped early: what is missing is the missing comma's doing.
     if (line.scanned.nStrayWordColumn > 0) return;
@@ -100,6 +112,9 @@ TCheckResult checkProgram(CHostRobotConfiguration &config, const CProgramText &p
     finding.sCode = "RC001";
     finding.nLine = refusal.nLine;
     finding.sMessage = refusal.sMessage.toUtf8();
+    for (const TCheckedLine &line : context.lines)
+      if (line.nLine == refusal.nLine)
+        for (const std::wstring &sWord : line.keywordSuggestions) finding.suggestions.push_back(utf8(sWord));
     context.findings.push_back(std::move(finding));
   }
   // Messages of the reading: the board change and the port-order rules.

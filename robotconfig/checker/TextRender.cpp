@@ -50,6 +50,8 @@ std::string renderText(const TFileFindings &file, const TTextOptions &options) {
     if (options.bErrorsOnly && finding.nSeverity != TSeverity::kError) continue;
     if (finding.sCode == "RC001") {
       sOut += location(file.sFile, finding.nLine, 0) + ": error: " + finding.sMessage + "\n";
+      if (!finding.suggestions.empty())
+        sOut += location(file.sFile, finding.nLine, 0) + ": note: did you mean " + wordList(finding.suggestions) + "?\n";
       continue;
     }
     sOut += location(file.sFile, finding.nLine, finding.nColumn) + ": " + severityWord(finding.nSeverity) + ": " +
