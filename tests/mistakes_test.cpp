@@ -11,6 +11,8 @@
 #include <string>
 #include <vector>
 
+#include <unistd.h>
+
 #include "robotconfig/checker/RuleTable.h"
 #include "tests/subprocess.h"
 
@@ -109,7 +111,10 @@ TEST(Mistakes, CheckCleanMeansFormatSettles) {
     if (run("check", c).nExit != 0) continue;
     const TRunResult format = run("format", c);
     ASSERT_EQ(format.nExit, 0) << format.sErr;
-    const fs::path formatted = fs::temp_directory_path() / ("robotcfg-mistake-" + fs::path(c.sFile).filename().string());
+    // Named after the case and the process: examples share a file name, and test runs may overlap.
+    std::string sName = c.sFile;
+    std::replace(sName.begin(), sName.end(), '/', '-');
+    const fs::path formatted = fs::temp_directory_path() / ("robotcfg-" + std::to_string(getpid()) + "-" + sName);
     std::ofstream(formatted, std::ios::binary) << format.sOut;
     const TCase again{formatted.string(), c.options};
     const TRunResult check = run("check", again);
