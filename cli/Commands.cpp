@@ -35,19 +35,6 @@ bool settledBlock(const std::string &sPath, const TReadProgram &program, CString
 
 void writeStdout(const std::string &sBytes) { std::fwrite(sBytes.data(), 1, sBytes.size(), stdout); }
 
-// readProgram, noting on standard error when the program's board made the IDE switch boards.
-bool readProgramNotingBoard(const std::string &sPath, TReadProgram &program) {
-  // Every file starts from the command line's board, whatever board an earlier one named.
-  CHostSelectionScope scope;
-  const TControllerBoardType nBoardBefore = pToggles->getIDECircuitBoardType();
-  if (!readProgram(sPath, program)) return false;
-  const TControllerBoardType nBoard = pToggles->getIDECircuitBoardType();
-  if (nBoard != nBoardBefore)
-    std::fprintf(stderr, "%s: note: now assuming board '%s' (%d)\n", displayName(sPath).c_str(),
-                 CString(getCktBoardNameString(nBoard)).toUtf8().c_str(), nBoard);
-  return true;
-}
-
 }  // namespace
 
 int runCheck(const TOptions &options) { return runCheckCommand(options); }
@@ -118,23 +105,4 @@ int runGenerate(const TOptions &options) {
   if (!settledBlock(sPath, program, sBlock)) return kExitRejected;
   writeStdout(encodeGeneratedBlock(sBlock, program.pText->lineEnding()));
   return kExitOk;
-}
-
-int runShow(const TOptions &options) {
-  std::string sOut;
-  if (options.files.empty()) {
-    CHostRobotConfiguration config;
-    CWarningPrinter warnings("robotcfg");
-    config.clearConfigurationDefinition();
-    printConfiguration(config, sOut);
-    writeStdout(sOut);
-    return kExitOk;
-  }
-  const std::string &sPath = options.files.front();
-  TReadProgram program;
-  if (!readProgramNotingBoard(sPath, program)) return kExitUsage;
-  const bool bRejected = reportDiagnostics(sPath, program);
-  printConfiguration(*program.pConfig, sOut);
-  writeStdout(sOut);
-  return bRejected ? kExitRejected : kExitOk;
 }

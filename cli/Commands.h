@@ -18,10 +18,5 @@ int runSaveModel(const TOptions &options);
 int runInit(const TOptions &options);
 int runCompletion(const TOptions &options);
 
-class CRobotConfigurationBasic;
-/// Prints the configuration as port tables.
-void printConfiguration(CRobotConfigurationBasic &config, std::string &sOut);
-/// Board, fixed pins and plug-in boards, for show.
-void printBoardDetails(CRobotConfigurationBasic &config, std::string &sOut);
-/// Drive train, firmware features, program type and memory, for show.
-void printDriveAndProgramDetails(CRobotConfigurationBasic &config, std::string &sOut);
+int runSet(const TOptions &options);
+int runApply(const TOptions &options);

@@ -11,8 +11,9 @@ constexpr unsigned kShow = commandBit(TCommand::kShow);
 constexpr unsigned kDiff = commandBit(TCommand::kDiff);
 constexpr unsigned kModels = commandBit(TCommand::kModels);
 constexpr unsigned kSaveModel = commandBit(TCommand::kSaveModel);
+constexpr unsigned kEdits = commandBit(TCommand::kSet) | commandBit(TCommand::kApply);
 /// Commands that read programs, and so a project file.
-constexpr unsigned kReading = kCheck | kFormat | kGenerate | kShow | kDiff | kModels | kSaveModel;
+constexpr unsigned kReading = kCheck | kFormat | kGenerate | kShow | kDiff | kModels | kSaveModel | kEdits;
 
 using TApply = bool (*)(TOptions &, const std::string &, std::string &);
 
@@ -78,9 +79,11 @@ const TCommandSpec kCommandSpecs[] = {
      "the program.\n",
      "0 done, 1 refused lines, 2 usage or I/O error.", "robotcfg generate robot.c"},
     {TCommand::kShow, "show", "[FILE]", 0, 1, "show takes at most one file",
-     "print the configuration (of FILE, or the empty one) as port tables",
-     "Prints the motors, sensors, servos, board, drive train and memory of a\n"
-     "program's configuration, or of the empty configuration of the platform.\n",
+     "summarise the configured devices (of FILE, or the empty configuration)",
+     "Prints the configured motors, sensors, servos, hubs, serial ports, board and\n"
+     "drive train of a program's configuration (--all: every port), or with --json\n"
+     "the configuration as a JSON document (docs/configuration.schema.json), or\n"
+     "with --svg a picture of the wiring.\n",
      "0 done, 1 refused lines, 2 usage or I/O error.", "robotcfg show --platform nxt --external-controllers"},
     {TCommand::kDiff, "diff", "A B", 2, 2, "diff takes exactly two files",
      "compare the configurations of two programs (-v: which devices differ)",
@@ -98,6 +101,19 @@ const TCommandSpec kCommandSpecs[] = {
      "Writes the configuration of FILE, device by device, as a model file that a\n"
      "UserModel line can name.\n",
      "0 saved, 1 refused lines, 2 usage or I/O error.", "robotcfg save-model robot.c -o base.model"},
+    {TCommand::kSet, "set", "FILE PATH=VALUE...", 2, -1, "set takes a file and at least one PATH=VALUE",
+     "change the configuration through the record's setters and print the program",
+     "Changes the configuration as the setup dialogs do (motor.port2.type=tmotorVex393_MC29,\n"
+     "sensor.in1=sensorTouch, sensor.in1.name=bumper, board=typeCktBoardUno, ...) and\n"
+     "prints the program with its new block, or rewrites it with -i. An edit the\n"
+     "rules refuse is reported and nothing is written.\n",
+     "0 done, 1 refused lines or edits, 2 usage or I/O error.",
+     "robotcfg set -i robot.c motor.port2.type=tmotorVex393_MC29 motor.port2.name=left"},
+    {TCommand::kApply, "apply", "FILE EDITS.json", 2, 2, "apply takes a file and a JSON file of edits",
+     "the same as set, with a JSON list of edits",
+     "Reads a JSON list of {\"op\": \"set\", \"path\": ..., \"value\": ...} and applies it\n"
+     "as set does.\n",
+     "0 done, 1 refused lines or edits, 2 usage or I/O error.", "robotcfg apply -i robot.c edits.json"},
         {TCommand::kInit, "init", "", 0, 0, "init takes no file",
      "write a commented robotcfg.toml in the current folder",
      "Writes robotcfg.toml, with the platform, board and controller toggle given\n"
@@ -129,7 +145,11 @@ const TOptionSpec kOptionSpecs[] = {
     {nullptr, "--stdin-filename", "NAME", kReading,
      "the name of the program read from '-' in messages; its folder is where its project file and user models are found", "@files",
      TEXT(sStdinFilename)},
-    {"-i", "--in-place", nullptr, kFormat, "rewrite the files instead of printing them", nullptr, SWITCH(bInPlace)},
+    {"-i", "--in-place", nullptr, kFormat | kEdits, "rewrite the files instead of printing them", nullptr, SWITCH(bInPlace)},
+    {nullptr, "--json", nullptr, kShow, "the configuration as a JSON document", nullptr, SWITCH(bJson)},
+    {nullptr, "--choices", nullptr, kShow, "with --json: the words each device may take", nullptr, SWITCH(bChoices)},
+    {nullptr, "--all", nullptr, kShow, "every port, not only the configured devices", nullptr, SWITCH(bAll)},
+    {nullptr, "--svg", nullptr, kShow, "an SVG picture of the wiring", nullptr, SWITCH(bSvg)},
     {nullptr, "--check", nullptr, kFormat, "change nothing; exit 1 when a block is not in generated form", nullptr,
      SWITCH(bCheckOnly)},
     {nullptr, "--diff", nullptr, kFormat, "print a unified diff of each file that would change; exit 1 when any would",

@@ -192,12 +192,22 @@ bool parseOptions(int argc, char **argv, TOptions &options, std::string &sError)
     sError = ways[0] + " and " + ways[1] + " cannot be combined";
     return false;
   }
+  if (options.bJson && options.bSvg) {
+    sError = "--json and --svg cannot be combined";
+    return false;
+  }
+  if (options.bChoices && !options.bJson) {
+    sError = "--choices needs --json";
+    return false;
+  }
   if (options.bNoConfig && !options.sConfigPath.empty()) {
     sError = "--config and --no-config cannot be combined";
     return false;
   }
+  // set and apply rewrite their first file only.
+  const bool bEdits = options.nCommand == TCommand::kSet || options.nCommand == TCommand::kApply;
   if (options.bInPlace)
-    for (const std::string &sFile : options.files)
+    for (const std::string &sFile : bEdits ? std::vector<std::string>{options.files.front()} : options.files)
       if (sFile == "-") {
         sError = "cannot rewrite standard input in place";
         return false;

@@ -6,7 +6,7 @@
 
 #include "robotconfig/host/DeviceTypes.h"
 
-enum class TCommand { kNone, kCheck, kFormat, kGenerate, kShow, kDiff, kModels, kSaveModel, kInit, kCompletion };
+enum class TCommand { kNone, kCheck, kFormat, kGenerate, kShow, kDiff, kModels, kSaveModel, kInit, kCompletion, kSet, kApply };
 
 /// When output is coloured.
 enum class TColorWhen { kAuto, kAlways, kNever };
@@ -37,6 +37,10 @@ struct TOptions {
   std::string sConfigPath;          ///< --config FILE
   bool bNoConfig = false;           ///< --no-config
   TColorWhen nColor = TColorWhen::kAuto;
+  bool bJson = false;     ///< show --json
+  bool bChoices = false;  ///< show --json --choices
+  bool bAll = false;      ///< show --all: every port, not only configured devices
+  bool bSvg = false;      ///< show --svg
   bool bHelp = false;
   bool bVersion = false;
   bool bManPage = false;            ///< --man

@@ -3,6 +3,7 @@
 #include <cstdio>
 #include <utility>
 
+#include "robotconfig/host/Platform.h"
 #include "robotconfig/program/FileIO.h"
 
 CWarningPrinter::CWarningPrinter(std::string sFile)
@@ -54,4 +55,16 @@ bool reportDiagnostics(const std::string &sPath, const TReadProgram &program) {
     std::fprintf(stderr, "%s:%d: error: %s\n", displayName(sPath).c_str(), diagnostic.nLine,
                  diagnostic.sMessage.toUtf8().c_str());
   return !program.diagnostics.empty();
+}
+
+bool readProgramNotingBoard(const std::string &sPath, TReadProgram &program) {
+  // Every file starts from the command line's board, whatever board an earlier one named.
+  CHostSelectionScope scope;
+  const TControllerBoardType nBoardBefore = pToggles->getIDECircuitBoardType();
+  if (!readProgram(sPath, program)) return false;
+  const TControllerBoardType nBoard = pToggles->getIDECircuitBoardType();
+  if (nBoard != nBoardBefore)
+    std::fprintf(stderr, "%s: note: now assuming board '%s' (%d)\n", displayName(sPath).c_str(),
+                 CString(getCktBoardNameString(nBoard)).toUtf8().c_str(), nBoard);
+  return true;
 }

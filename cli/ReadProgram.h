@@ -47,3 +47,7 @@ bool readProgram(const std::string &sPath, TReadProgram &program);
 
 /// Prints the refused lines as FILE:LINE: error: MESSAGE; true when there were any.
 bool reportDiagnostics(const std::string &sPath, const TReadProgram &program);
+
+/// readProgram, noting on standard error when the program's board made the
+/// IDE switch boards; every file starts from the command line's board.
+bool readProgramNotingBoard(const std::string &sPath, TReadProgram &program);

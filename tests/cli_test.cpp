@@ -369,15 +369,15 @@ TEST(Cli, ShowPrintsThePlatformFirst) {
     std::vector<std::string> args;
     std::string sHead;
   } kCases[] = {
-      {{"show", "--platform", "nxt"}, "Platform: NXT (kind 1)\n"},
-      {{"show"}, "Platform: NXT (kind 1)\nBoard: NXT Brick (1), CPU clock 48000000\n"
+      {{"show", "--platform", "nxt"}, "Platform: NXT\n"},
+      {{"show"}, "Platform: NXT\nBoard: NXT Brick, CPU AT91SAM7S256 at 48000000 Hz\n"
                  "External Motor/Servo Controllers: off\n"},
-      {{"show", "--platform=2"}, "Platform: VEX PIC (kind 2)\nBoard: VEX PIC Controller (2), CPU clock 10000000\n"},
+      {{"show", "--platform=2"}, "Platform: VEX PIC\nBoard: VEX PIC Controller, CPU PIC18F8520 at 10000000 Hz\n"},
       {{"--platform", "vexi2c", "--external-controllers", "show"},
-       "Platform: VEX I2C (kind 3)\nBoard: VEX I2C Controller (5), CPU clock 72000000\n"
+       "Platform: VEX I2C\nBoard: VEX I2C Controller, CPU STM32F103VD at 72000000 Hz\n"
        "External Motor/Servo Controllers: on\n"},
       {{"show", "--platform", "arduino", "--board", "typeCktBoardMega2560"},
-       "Platform: Arduino (kind 4)\nBoard: Arduino Mega 2560 (13), CPU clock 16000000\n"},
+       "Platform: Arduino\nBoard: Arduino Mega 2560 (typeCktBoardMega2560), CPU ATmega2560 at 16000000 Hz\n"},
   };
   for (const auto &test : kCases) {
     const TRunResult r = runRobotcfg(test.args);
