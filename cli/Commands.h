@@ -20,3 +20,4 @@ int runCompletion(const TOptions &options);
 
 int runSet(const TOptions &options);
 int runApply(const TOptions &options);
+int runServe(const TOptions &options);

@@ -1,5 +1,6 @@
 #include "cli/OptionTable.h"
 
+#include <cstdlib>
 #include <cstring>
 
 namespace {
@@ -12,6 +13,7 @@ constexpr unsigned kDiff = commandBit(TCommand::kDiff);
 constexpr unsigned kModels = commandBit(TCommand::kModels);
 constexpr unsigned kSaveModel = commandBit(TCommand::kSaveModel);
 constexpr unsigned kEdits = commandBit(TCommand::kSet) | commandBit(TCommand::kApply);
+constexpr unsigned kServe = commandBit(TCommand::kServe);
 /// Commands that read programs, and so a project file.
 constexpr unsigned kReading = kCheck | kFormat | kGenerate | kShow | kDiff | kModels | kSaveModel | kEdits;
 
@@ -35,6 +37,13 @@ bool setReportFormat(TOptions &options, const std::string &sValue, std::string &
   }
   options.sReportFormat = sValue;
   return true;
+}
+
+bool setServePort(TOptions &options, const std::string &sValue, std::string &sError) {
+  const bool bDigits = !sValue.empty() && sValue.size() <= 5 && sValue.find_first_not_of("0123456789") == std::string::npos;
+  options.nServePort = bDigits ? std::atoi(sValue.c_str()) : -1;
+  if (options.nServePort < 0 || options.nServePort > 65535) sError = "--port takes a number 0..65535";
+  return sError.empty();
 }
 
 bool setPlatform(TOptions &options, const std::string &sValue, std::string &sError) {
@@ -114,6 +123,13 @@ const TCommandSpec kCommandSpecs[] = {
      "Reads a JSON list of {\"op\": \"set\", \"path\": ..., \"value\": ...} and applies it\n"
      "as set does.\n",
      "0 done, 1 refused lines or edits, 2 usage or I/O error.", "robotcfg apply -i robot.c edits.json"},
+    {TCommand::kServe, "serve", "FILE|FOLDER...", 1, -1, "serve takes the programs or folders to open",
+     "the setup dialogs as a local web page",
+     "Serves a page on 127.0.0.1 with a tab per setup dialog, the generated block,\n"
+     "the findings and the wiring picture, and prints its URL with a secret token.\n"
+     "Only the files named and the .c files under the folders named can be opened.\n"
+     "Ctrl-C stops it.\n",
+     "0 stopped, 2 usage error or the port cannot be opened.", "robotcfg serve --platform vexi2c robot.c"},
         {TCommand::kInit, "init", "", 0, 0, "init takes no file",
      "write a commented robotcfg.toml in the current folder",
      "Writes robotcfg.toml, with the platform, board and controller toggle given\n"
@@ -150,6 +166,8 @@ const TOptionSpec kOptionSpecs[] = {
     {nullptr, "--choices", nullptr, kShow, "with --json: the words each device may take", nullptr, SWITCH(bChoices)},
     {nullptr, "--all", nullptr, kShow, "every port, not only the configured devices", nullptr, SWITCH(bAll)},
     {nullptr, "--svg", nullptr, kShow, "an SVG picture of the wiring", nullptr, SWITCH(bSvg)},
+    {nullptr, "--port", "N", kServe, "the port to listen on (default: a free one)", nullptr, setServePort},
+    {nullptr, "--host", "H", kServe, "listen on H instead of 127.0.0.1 (with a warning)", nullptr, TEXT(sServeHost)},
     {nullptr, "--check", nullptr, kFormat, "change nothing; exit 1 when a block is not in generated form", nullptr,
      SWITCH(bCheckOnly)},
     {nullptr, "--diff", nullptr, kFormat, "print a unified diff of each file that would change; exit 1 when any would",

@@ -6,7 +6,7 @@
 
 #include "robotconfig/host/DeviceTypes.h"
 
-enum class TCommand { kNone, kCheck, kFormat, kGenerate, kShow, kDiff, kModels, kSaveModel, kInit, kCompletion, kSet, kApply };
+enum class TCommand { kNone, kCheck, kFormat, kGenerate, kShow, kDiff, kModels, kSaveModel, kInit, kCompletion, kSet, kApply, kServe };
 
 /// When output is coloured.
 enum class TColorWhen { kAuto, kAlways, kNever };
@@ -41,6 +41,8 @@ struct TOptions {
   bool bChoices = false;  ///< show --json --choices
   bool bAll = false;      ///< show --all: every port, not only configured devices
   bool bSvg = false;      ///< show --svg
+  int nServePort = 0;        ///< serve --port (0: a free port)
+  std::string sServeHost;    ///< serve --host (empty: 127.0.0.1)
   bool bHelp = false;
   bool bVersion = false;
   bool bManPage = false;            ///< --man

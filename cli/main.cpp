@@ -61,6 +61,7 @@ int main(int argc, char **argv) {
     case TCommand::kCompletion: nStatus = runCompletion(options); break;
     case TCommand::kSet: nStatus = runSet(options); break;
     case TCommand::kApply: nStatus = runApply(options); break;
+    case TCommand::kServe: nStatus = runServe(options); break;
     case TCommand::kNone: break;
   }
   // Output that could not be written (a full disk, a closed pipe) is an I/O error.

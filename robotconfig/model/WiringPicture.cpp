@@ -87,8 +87,9 @@ std::vector<TRow> pictureRows(const json &doc) {
   };
   for (const json &motor : doc["motors"])
     if (!motor["type"].is_null()) add("motor", motor, motorDetail(motor));
+  // A hub chain's port is drawn as the chain itself.
   for (const json &sensor : doc["sensors"])
-    if (!sensor["type"].is_null())
+    if (!sensor["type"].is_null() && !(text(sensor["type"]) == "sensorI2CMuxController" && !doc["hubs"].empty()))
       add("sensor", sensor, text(sensor["type"]) + (sensor["mode"].is_string() ? ", " + text(sensor["mode"]) : ""));
   for (const json &servo : doc["servos"])
     if (!servo["type"].is_null()) add("servo", servo, text(servo["type"]));
@@ -100,7 +101,7 @@ std::vector<TRow> pictureRows(const json &doc) {
       if (text(link) == "none") continue;
       const std::string sChain = sPort + "_C" + std::to_string(nPosition);
       rows.push_back({"hub", nPosition == 1 ? sPort : "", text(link) + " controller " + std::to_string(nPosition),
-                      "daisy chain on " + sPort, nPosition > 1, "hub-" + sChain});
+                      "daisy chain on " + sPort, false, "hub-" + sChain});
       for (const TRow &device : chained)
         if (chainOf(device.sPort) == sChain) {
           TRow row = device;
@@ -141,7 +142,7 @@ std::string xmlEscaped(const std::string &sText) {
 std::string wiringPicture(const json &doc) {
   const std::vector<TRow> rows = pictureRows(doc);
   std::string sDrive;
-  if (doc.contains("driveTrain")) {
+  if (doc.contains("driveTrain") && !doc["driveTrain"]["motors"].empty()) {
     std::string sMotors;
     for (const json &motor : doc["driveTrain"]["motors"])
       sMotors += (sMotors.empty() ? "" : ", ") + (motor.is_string() ? text(motor) : std::string("none"));
@@ -187,11 +188,16 @@ std::string wiringPicture(const json &doc) {
       s += "  <line x1=\"" + std::to_string(kControllerX + kControllerWidth) + "\" y1=\"" + std::to_string(nMid) +
            "\" x2=\"" + std::to_string(nX) + "\" y2=\"" + std::to_string(nMid) + "\" stroke=\"" + style.pzStroke +
            "\" stroke-width=\"2\"/>\n";
+    } else if (nPreviousHubY >= 0 && row.sKind == "hub") {
+      // The next controller of a daisy chain hangs from the one before it.
+      s += "  <line x1=\"" + std::to_string(kDeviceX + 8) + "\" y1=\"" + std::to_string(nPreviousHubY + 40) + "\" x2=\"" +
+           std::to_string(kDeviceX + 8) + "\" y2=\"" + std::to_string(nY) + "\" stroke=\"" + styleOf("hub").pzStroke +
+           "\" stroke-width=\"3\" stroke-dasharray=\"6 4\"/>\n";
     } else if (nPreviousHubY >= 0) {
-      // A device on a hub, or the next controller of a chain: wired to the hub above.
-      s += "  <path d=\"M" + std::to_string(kDeviceX + 16) + " " + std::to_string(nPreviousHubY + 40) + " V" +
+      // A device on a hub: wired to its controller above.
+      s += "  <path d=\"M" + std::to_string(kDeviceX + 20) + " " + std::to_string(nPreviousHubY + 40) + " V" +
            std::to_string(nMid) + " H" + std::to_string(nX) + "\" fill=\"none\" stroke=\"" + styleOf("hub").pzStroke +
-           "\" stroke-width=\"2\"" + (row.sKind == "hub" ? " stroke-dasharray=\"6 4\"" : "") + "/>\n";
+           "\" stroke-width=\"2\"/>\n";
     }
     s += "  <rect x=\"" + std::to_string(nX) + "\" y=\"" + std::to_string(nY) + "\" width=\"" +
          std::to_string(kDeviceWidth) + "\" height=\"40\" rx=\"6\" fill=\"" + style.pzFill + "\" stroke=\"" +

@@ -1,0 +1,6 @@
+// The page of `robotcfg serve`, compiled into the tool.
+#pragma once
+
+const char *servePageHtml();
+const char *servePageCss();
+const char *servePageScript();
