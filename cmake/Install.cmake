@@ -3,7 +3,11 @@
 include(GNUInstallDirs)
 include(CMakePackageConfigHelpers)
 
-install(TARGETS robotconfig robotconfig_checker robotconfig_model EXPORT robotconfigTargets
+set(ROBOTCONFIG_INSTALLED_TARGETS robotconfig)
+if(TARGET robotconfig_checker)
+  list(APPEND ROBOTCONFIG_INSTALLED_TARGETS robotconfig_checker robotconfig_model)
+endif()
+install(TARGETS ${ROBOTCONFIG_INSTALLED_TARGETS} EXPORT robotconfigTargets
   ARCHIVE DESTINATION ${CMAKE_INSTALL_LIBDIR}
   INCLUDES DESTINATION ${CMAKE_INSTALL_INCLUDEDIR})
 install(DIRECTORY ${PROJECT_SOURCE_DIR}/robotconfig
