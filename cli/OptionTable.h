@@ -48,7 +48,7 @@ extern const size_t kNumbOfOptionSpecs;
 
 /// The command of a name; null when none.
 const TCommandSpec *findCommandSpec(const std::string &sName);
-/// The command spec of a command; null for kNone.
+/// The table row of a command; null for kNone.
 const TCommandSpec *commandSpecOf(TCommand nCommand);
 /// "--long" or "-s, --long" as the help shows an option, with its value name.
 std::string optionLabel(const TOptionSpec &option);
