@@ -20,14 +20,7 @@ bool readAndCheckProgram(const std::string &sPath, const TOptions &options, TRea
                          TFileFindings &findings) {
   // Every file starts from the command line's board, whatever board an earlier one named.
   CHostSelectionScope scope;
-  std::string sBytes, sError;
-  if (!readProgramFile(sPath, sBytes, sError)) {
-    std::fprintf(stderr, "robotcfg: %s\n", sError.c_str());
-    return false;
-  }
-  program.pText = std::make_unique<CProgramText>(std::move(sBytes));
-  program.pConfig = std::make_unique<CHostRobotConfiguration>();
-  program.pConfig->setPathName(CString::fromUtf8(programPath(sPath)));
+  if (!loadProgram(sPath, program)) return false;
   TCheckOptions checkOptions;
   checkOptions.bBoardChosen = options.nBoard >= 0;
   TCheckResult result = checkProgram(*program.pConfig, *program.pText, checkOptions);

@@ -36,7 +36,7 @@ std::string displayName(const std::string &sPath) {
 
 std::string programPath(const std::string &sPath) { return sPath == "-" ? stdinFilename() : sPath; }
 
-bool readProgram(const std::string &sPath, TReadProgram &program) {
+bool loadProgram(const std::string &sPath, TReadProgram &program) {
   std::string sBytes, sError;
   if (!readProgramFile(sPath, sBytes, sError)) {
     std::fprintf(stderr, "robotcfg: %s\n", sError.c_str());
@@ -45,6 +45,11 @@ bool readProgram(const std::string &sPath, TReadProgram &program) {
   program.pText = std::make_unique<CProgramText>(std::move(sBytes));
   program.pConfig = std::make_unique<CHostRobotConfiguration>();
   program.pConfig->setPathName(CString::fromUtf8(programPath(sPath)));
+  return true;
+}
+
+bool readProgram(const std::string &sPath, TReadProgram &program) {
+  if (!loadProgram(sPath, program)) return false;
   CWarningPrinter warnings(displayName(sPath));
   program.diagnostics = readProgramConfiguration(*program.pConfig, *program.pText);
   return true;

@@ -41,6 +41,10 @@ struct TReadProgram {
   std::vector<TConfigurationDiagnostic> diagnostics;
 };
 
+/// Reads a program's bytes into `program` with a fresh record named after it,
+/// without reading its configuration; false after printing why it cannot be read.
+bool loadProgram(const std::string &sPath, TReadProgram &program);
+
 /// Reads a program and its configuration; false (after printing why) when the
 /// file cannot be read.
 bool readProgram(const std::string &sPath, TReadProgram &program);

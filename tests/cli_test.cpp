@@ -14,6 +14,8 @@
 
 namespace {
 
+using testing_support::readFile;
+
 using testing_support::CTempDir;
 using testing_support::lineDiff;
 using testing_support::runRobotcfg;
@@ -29,13 +31,6 @@ const std::string kRefusedMessage = "Invalid multi-robot network type 'ntwkBogus
 void writeFile(const std::string &sPath, const std::string &sBytes) {
   std::ofstream out(sPath, std::ios::binary | std::ios::trunc);
   out << sBytes;
-}
-
-std::string readFile(const std::string &sPath) {
-  std::ifstream in(sPath, std::ios::binary);
-  std::ostringstream bytes;
-  bytes << in.rdbuf();
-  return bytes.str();
 }
 
 std::set<std::string> directoryNames(const std::string &sDir) {

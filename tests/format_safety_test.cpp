@@ -16,6 +16,8 @@
 
 namespace {
 
+using testing_support::readFile;
+
 using testing_support::runProcess;
 using testing_support::runRobotcfg;
 using testing_support::CTempDir;
@@ -23,13 +25,6 @@ using testing_support::CTempDir;
 // A program whose regenerated block differs from what it holds.
 const std::string kProgram =
     "#pragma config(CPU_Parameters, x, 8000000)\n" + std::string(2000, '/') + "\nint main() { return 0; }\n";
-
-std::string readFile(const std::string &sPath) {
-  std::ifstream in(sPath, std::ios::binary);
-  std::ostringstream out;
-  out << in.rdbuf();
-  return out.str();
-}
 
 void writeFile(const std::string &sPath, const std::string &sBytes) {
   std::ofstream(sPath, std::ios::binary) << sBytes;

@@ -13,25 +13,12 @@
 
 namespace {
 
+using testing_support::readFile;
+
 namespace fs = std::filesystem;
 using testing_support::lineDiff;
 using testing_support::runRobotcfg;
 using testing_support::TRunResult;
-
-std::string readFile(const fs::path &path) {
-  std::ifstream in(path, std::ios::binary);
-  std::ostringstream bytes;
-  bytes << in.rdbuf();
-  return bytes.str();
-}
-
-// The words of an options file, split at white space as a shell would.
-std::vector<std::string> optionWords(const std::string &sText) {
-  std::istringstream in(sText);
-  std::vector<std::string> words;
-  for (std::string sWord; in >> sWord;) words.push_back(sWord);
-  return words;
-}
 
 std::vector<std::string> exampleNames() {
   std::vector<std::string> names;
@@ -55,7 +42,7 @@ TEST(Examples, OutputsMatchTheRecordedOnes) {
   for (const std::string &sName : names) {
     SCOPED_TRACE("examples/" + sName);
     const fs::path dir = fs::path(ROBOTCONFIG_SOURCE_DIR) / "examples" / sName;
-    const std::vector<std::string> options = optionWords(readFile(dir / "options"));
+    const std::vector<std::string> options = testing_support::splitWords(readFile(dir / "options"));
     const std::string sExpectedCheck = readFile(dir / "expected-check.txt");
     const std::string sExpectedFormat = readFile(dir / "expected-format.c");
     const bool bRejected = sExpectedCheck.find(": error: ") != std::string::npos;

@@ -18,24 +18,12 @@
 
 namespace {
 
+using testing_support::readFile;
+
 namespace fs = std::filesystem;
 using testing_support::lineDiff;
 using testing_support::runRobotcfg;
 using testing_support::TRunResult;
-
-std::string readFile(const fs::path &path) {
-  std::ifstream in(path, std::ios::binary);
-  std::ostringstream bytes;
-  bytes << in.rdbuf();
-  return bytes.str();
-}
-
-std::vector<std::string> words(const std::string &sText) {
-  std::istringstream in(sText);
-  std::vector<std::string> out;
-  for (std::string sWord; in >> sWord;) out.push_back(sWord);
-  return out;
-}
 
 // A program to check, with the options it is checked with.
 struct TCase {
@@ -51,7 +39,7 @@ std::vector<TCase> corpus() {
     sFirst = sFirst.substr(0, sFirst.find('\n'));
     const std::string kPrefix = "// options:";
     cases.push_back({"tests/mistakes/" + entry.path().filename().string(),
-                     sFirst.rfind(kPrefix, 0) == 0 ? words(sFirst.substr(kPrefix.size())) : std::vector<std::string>{}});
+                     sFirst.rfind(kPrefix, 0) == 0 ? testing_support::splitWords(sFirst.substr(kPrefix.size())) : std::vector<std::string>{}});
   }
   std::sort(cases.begin(), cases.end(), [](const TCase &a, const TCase &b) { return a.sFile < b.sFile; });
   return cases;
@@ -62,7 +50,7 @@ std::vector<TCase> examples() {
   for (const fs::directory_entry &entry : fs::directory_iterator(fs::path(ROBOTCONFIG_SOURCE_DIR) / "examples"))
     if (entry.is_directory())
       cases.push_back({"examples/" + entry.path().filename().string() + "/program.c",
-                       words(readFile(entry.path() / "options"))});
+                       testing_support::splitWords(readFile(entry.path() / "options"))});
   return cases;
 }
 

@@ -16,14 +16,9 @@
 
 namespace {
 
-using testing_support::CTempDir;
+using testing_support::readFile;
 
-std::string readFile(const std::string &sPath) {
-  std::ifstream in(sPath, std::ios::binary);
-  std::stringstream s;
-  s << in.rdbuf();
-  return s.str();
-}
+using testing_support::CTempDir;
 
 void writeFile(const std::string &sPath, const std::string &sText) { std::ofstream(sPath, std::ios::binary) << sText; }
 

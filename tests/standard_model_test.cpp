@@ -22,6 +22,8 @@
 #include "tests/config_lines.h"
 
 namespace {
+
+using testing_support::readFile;
 using test_support::parseLine;
 
 
@@ -37,13 +39,6 @@ const std::wstring kCommentLine = CString::fromUtf8(kComment).str() + L"\r\n";
 
 void writeFile(const std::string &sPath, const std::string &sBytes) {
   std::ofstream(sPath, std::ios::binary | std::ios::trunc) << sBytes;
-}
-
-std::string readFile(const std::string &sPath) {
-  std::ifstream in(sPath, std::ios::binary);
-  std::ostringstream bytes;
-  bytes << in.rdbuf();
-  return bytes.str();
 }
 
 std::vector<std::string> directoryNames(const std::string &sDir) {

@@ -15,7 +15,9 @@
 #include <cstdlib>
 #include <cstring>
 #include <filesystem>
+#include <fstream>
 #include <optional>
+#include <sstream>
 #include <string>
 #include <vector>
 
@@ -189,5 +191,21 @@ class CTempDir {
  private:
   std::string m_sPath;
 };
+
+/// A whole file's bytes; empty when it cannot be read.
+inline std::string readFile(const std::string &sPath) {
+  std::ifstream in(sPath, std::ios::binary);
+  std::ostringstream bytes;
+  bytes << in.rdbuf();
+  return bytes.str();
+}
+
+/// The words of a text split at white space, as a shell splits an options line.
+inline std::vector<std::string> splitWords(const std::string &sText) {
+  std::istringstream in(sText);
+  std::vector<std::string> words;
+  for (std::string sWord; in >> sWord;) words.push_back(sWord);
+  return words;
+}
 
 }  // namespace testing_support
